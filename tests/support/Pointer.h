@@ -2,6 +2,7 @@
 // A mouse with a clock of its own: events go through the window system with chosen time stamps.
 #pragma once
 
+#include <QtCore/QEvent>
 #include <QtCore/QPoint>
 #include <QtCore/QPointer>
 #include <QtWidgets/QWidget>
