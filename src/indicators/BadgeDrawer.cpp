@@ -24,13 +24,13 @@ constexpr double CrossWidth = 10.0;
 constexpr double ArcWidth = 15.0;
 constexpr double SpokeWidth = 12.0;
 
-void drawRounded(QPainter &painter, const QRect &rect)
+void drawRounded(QPainter& painter, const QRect& rect)
 {
     const double radius = rect.height() / 2.0;
     painter.drawRoundedRect(rect, radius, radius, Qt::AbsoluteSize);
 }
 
-QConicalGradient turningGradient(const QRect &rect, int angle, const QColor &color1, const QColor &color2)
+QConicalGradient turningGradient(const QRect& rect, int angle, const QColor& color1, const QColor& color2)
 {
     QConicalGradient gradient(rect.center(), angle);
     gradient.setColorAt(0.0, color1);
@@ -39,10 +39,9 @@ QConicalGradient turningGradient(const QRect &rect, int angle, const QColor &col
 }
 
 // QPixmap::scaled() prints a warning for a null source and for a result without room; this one is silent.
-QPixmap covering(const QPixmap &canvas, const QSize &wanted)
+QPixmap covering(const QPixmap& canvas, const QSize& wanted)
 {
-    if (canvas.isNull() || BadgeGeometry::coveringSize(canvas.size(), wanted).isEmpty())
-    {
+    if (canvas.isNull() || BadgeGeometry::coveringSize(canvas.size(), wanted).isEmpty()) {
         return QPixmap();
     }
     return canvas.scaled(wanted, Qt::KeepAspectRatioByExpanding, Qt::SmoothTransformation);
@@ -50,7 +49,7 @@ QPixmap covering(const QPixmap &canvas, const QSize &wanted)
 
 } // namespace
 
-BadgeDrawer::BadgeDrawer(QObject *parent, QWidget *widget)
+BadgeDrawer::BadgeDrawer(QObject* parent, QWidget* widget)
     : QObject(parent)
     , m_widget(widget)
     , m_busyBadgeType(ebbtSpokes)
@@ -72,12 +71,12 @@ BadgeDrawer::BadgeDrawer(QObject *parent, QWidget *widget)
 
 BadgeDrawer::~BadgeDrawer() = default;
 
-void BadgeDrawer::setBadgeWidget(QWidget *widget)
+void BadgeDrawer::setBadgeWidget(QWidget* widget)
 {
     m_widget = widget;
 }
 
-void BadgeDrawer::setBadgeLabel(const QString &text, const QSize &size, bool stroke, bool crossed)
+void BadgeDrawer::setBadgeLabel(const QString& text, const QSize& size, bool stroke, bool crossed)
 {
     m_busyTimer.stop();
     m_label = text;
@@ -85,7 +84,7 @@ void BadgeDrawer::setBadgeLabel(const QString &text, const QSize &size, bool str
     refreshHost();
 }
 
-void BadgeDrawer::setBadgeLabel(const QString &text, bool crossed)
+void BadgeDrawer::setBadgeLabel(const QString& text, bool crossed)
 {
     setBadgeLabel(text, m_badgeSize, m_badgeStroke, crossed);
 }
@@ -105,39 +104,29 @@ QString BadgeDrawer::badgeLabel() const
 
 void BadgeDrawer::setBadgeBusy(bool on)
 {
-    if (m_busy == on)
-    {
+    if (m_busy == on) {
         return;
     }
     m_busy = on;
-    if (on)
-    {
+    if (on) {
         m_label.clear();
         m_busyAngle = BadgeGeometry::FirstAngle;
         m_busyFrame = 0;
         m_pixmap = framePixmap(m_busyAngle, m_busySpan);
-        if (!m_widget)
-        {
+        if (!m_widget) {
             m_busyTimer.start();
-        }
-        else
-        {
-            if (m_widget->isVisible())
-            {
+        } else {
+            if (m_widget->isVisible()) {
                 m_busyTimer.start();
             }
             m_widget->installEventFilter(this);
         }
-    }
-    else
-    {
+    } else {
         // Normally a label has stopped the timer already; not if the host was hidden and shown since.
         m_busyTimer.stop();
-        if (m_label.isEmpty())
-        {
+        if (m_label.isEmpty()) {
             m_pixmap = QPixmap();
-            if (m_widget)
-            {
+            if (m_widget) {
                 m_widget->removeEventFilter(this);
             }
         }
@@ -150,10 +139,9 @@ bool BadgeDrawer::badgeBusy() const
     return m_busy;
 }
 
-void BadgeDrawer::drawBadge(QPainter &painter, Qt::Alignment alignment)
+void BadgeDrawer::drawBadge(QPainter& painter, Qt::Alignment alignment)
 {
-    if (!m_widget || m_pixmap.isNull() || !painter.isActive())
-    {
+    if (!m_widget || m_pixmap.isNull() || !painter.isActive()) {
         return;
     }
     const QRect target = QStyle::alignedRect(Qt::LeftToRight, alignment, m_pixmap.size(), m_widget->rect());
@@ -185,7 +173,7 @@ QSize BadgeDrawer::badgeSize() const
     return m_badgeSize;
 }
 
-void BadgeDrawer::setBadgeSize(const QSize &size)
+void BadgeDrawer::setBadgeSize(const QSize& size)
 {
     m_badgeSize = size;
 }
@@ -205,7 +193,7 @@ QColor BadgeDrawer::badgeColor() const
     return m_badgeColor;
 }
 
-void BadgeDrawer::setBadgeColor(const QColor &color)
+void BadgeDrawer::setBadgeColor(const QColor& color)
 {
     m_badgeColor = color;
 }
@@ -215,7 +203,7 @@ QColor BadgeDrawer::badgeBackground() const
     return m_badgeBackground;
 }
 
-void BadgeDrawer::setBadgeBackground(const QColor &color)
+void BadgeDrawer::setBadgeBackground(const QColor& color)
 {
     m_badgeBackground = color;
 }
@@ -225,7 +213,7 @@ QColor BadgeDrawer::busyColor1() const
     return m_busyColor1;
 }
 
-void BadgeDrawer::setBusyColor1(const QColor &color)
+void BadgeDrawer::setBusyColor1(const QColor& color)
 {
     m_busyColor1 = color;
 }
@@ -235,7 +223,7 @@ QColor BadgeDrawer::busyColor2() const
     return m_busyColor2;
 }
 
-void BadgeDrawer::setBusyColor2(const QColor &color)
+void BadgeDrawer::setBusyColor2(const QColor& color)
 {
     m_busyColor2 = color;
 }
@@ -250,18 +238,16 @@ void BadgeDrawer::setBusyBadgeType(EBusyBadgeType type)
     m_busyBadgeType = type;
 }
 
-QPixmap BadgeDrawer::renderBadgePixmapFromText(const QString &text, bool stroke, bool crossed,
-                                               const QColor &foreground, const QColor &background)
+QPixmap BadgeDrawer::renderBadgePixmapFromText(
+    const QString& text, bool stroke, bool crossed, const QColor& foreground, const QColor& background)
 {
     QFont font;
     font.setPixelSize(BadgeGeometry::CanvasExtent);
     QRect pill(0, 0, BadgeGeometry::CanvasExtent, BadgeGeometry::CanvasExtent);
-    if (!text.isEmpty())
-    {
+    if (!text.isEmpty()) {
         const int room = BadgeGeometry::textRoomHeight(stroke);
         QRect measured = QFontMetrics(font).boundingRect(text);
-        while (measured.height() > room && font.pixelSize() > 1)
-        {
+        while (measured.height() > room && font.pixelSize() > 1) {
             font.setPixelSize(font.pixelSize() - 1);
             measured = QFontMetrics(font).boundingRect(text);
         }
@@ -270,8 +256,7 @@ QPixmap BadgeDrawer::renderBadgePixmapFromText(const QString &text, bool stroke,
 
     QPixmap pixmap(pill.size());
     pixmap.fill(Qt::transparent);
-    if (pixmap.isNull())
-    {
+    if (pixmap.isNull()) {
         return pixmap;
     }
 
@@ -282,19 +267,16 @@ QPixmap BadgeDrawer::renderBadgePixmapFromText(const QString &text, bool stroke,
     drawRounded(painter, pill);
 
     const QRect outline = BadgeGeometry::outlineRect(pill, stroke);
-    if (stroke)
-    {
+    if (stroke) {
         painter.setBrush(Qt::NoBrush);
         painter.setPen(QPen(foreground, OutlineWidth, Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin));
         drawRounded(painter, outline);
     }
-    if (crossed)
-    {
+    if (crossed) {
         painter.setPen(QPen(foreground, CrossWidth, Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin));
         painter.drawLine(BadgeGeometry::crossLine(outline));
     }
-    if (!text.isEmpty())
-    {
+    if (!text.isEmpty()) {
         painter.setFont(font);
         painter.setPen(QPen(foreground));
         painter.drawText(BadgeGeometry::textRect(outline), Qt::AlignHCenter | Qt::AlignVCenter, text);
@@ -302,26 +284,23 @@ QPixmap BadgeDrawer::renderBadgePixmapFromText(const QString &text, bool stroke,
     return pixmap;
 }
 
-QPixmap BadgeDrawer::renderBusyBadgePixmap(EBusyBadgeType type, int startAngle, int spanAngle,
-                                           const QColor &color1, const QColor &color2)
+QPixmap BadgeDrawer::renderBusyBadgePixmap(
+    EBusyBadgeType type, int startAngle, int spanAngle, const QColor& color1, const QColor& color2)
 {
     QPixmap pixmap(BadgeGeometry::CanvasExtent, BadgeGeometry::CanvasExtent);
     pixmap.fill(Qt::transparent);
-    if (pixmap.isNull())
-    {
+    if (pixmap.isNull()) {
         return pixmap;
     }
 
     QPainter painter(&pixmap);
     painter.setRenderHint(QPainter::Antialiasing);
-    switch (type)
-    {
+    switch (type) {
     case ebbtArc:
         painter.setPen(QPen(color1, ArcWidth, Qt::SolidLine, Qt::RoundCap, Qt::BevelJoin));
         painter.drawArc(BadgeGeometry::ringRect(), startAngle, spanAngle);
         break;
-    case ebbtRing:
-    {
+    case ebbtRing: {
         const QRect rect = BadgeGeometry::ringRect();
         const int angle = BadgeGeometry::gradientAngle(startAngle);
         const QBrush brush(turningGradient(rect, angle, color1, color2));
@@ -329,24 +308,20 @@ QPixmap BadgeDrawer::renderBusyBadgePixmap(EBusyBadgeType type, int startAngle, 
         painter.drawEllipse(rect);
         break;
     }
-    case ebbtDots:
-    {
+    case ebbtDots: {
         const int angle = BadgeGeometry::gradientAngle(startAngle);
         painter.setPen(Qt::NoPen);
         painter.setBrush(turningGradient(BadgeGeometry::dotsRect(), angle, color1, color2));
-        for (const QRect &dot : BadgeGeometry::dotRects())
-        {
+        for (const QRect& dot : BadgeGeometry::dotRects()) {
             drawRounded(painter, dot);
         }
         break;
     }
-    case ebbtSpokes:
-    {
+    case ebbtSpokes: {
         const int angle = BadgeGeometry::spokesGradientAngle(startAngle);
         const QBrush brush(turningGradient(BadgeGeometry::spokesRect(), angle, color1, color2));
         painter.setPen(QPen(brush, SpokeWidth, Qt::SolidLine, Qt::RoundCap));
-        for (const QLine &spoke : BadgeGeometry::spokeLines())
-        {
+        for (const QLine& spoke : BadgeGeometry::spokeLines()) {
             painter.drawLine(spoke);
         }
         break;
@@ -355,16 +330,12 @@ QPixmap BadgeDrawer::renderBusyBadgePixmap(EBusyBadgeType type, int startAngle, 
     return pixmap;
 }
 
-bool BadgeDrawer::eventFilter(QObject *watched, QEvent *event)
+bool BadgeDrawer::eventFilter(QObject* watched, QEvent* event)
 {
-    if (m_busy && watched == m_widget)
-    {
-        if (event->type() == QEvent::Show)
-        {
+    if (m_busy && watched == m_widget) {
+        if (event->type() == QEvent::Show) {
             m_busyTimer.start();
-        }
-        else if (event->type() == QEvent::Hide)
-        {
+        } else if (event->type() == QEvent::Hide) {
             m_busyTimer.stop();
         }
     }
@@ -375,15 +346,14 @@ void BadgeDrawer::updateBusyBadge()
 {
     m_busyAngle = BadgeGeometry::nextAngle(m_busyAngle);
     m_pixmap = framePixmap(m_busyAngle, m_busySpan);
-    if (m_widget)
-    {
+    if (m_widget) {
         m_widget->update();
     }
     Q_EMIT pixmapChanged();
 }
 
-QString BadgeDrawer::cacheKey(EBusyBadgeType type, const QSize &size, int startAngle, int spanAngle,
-                              const QColor &color1, const QColor &color2) const
+QString BadgeDrawer::cacheKey(EBusyBadgeType type, const QSize& size, int startAngle, int spanAngle,
+    const QColor& color1, const QColor& color2) const
 {
     return BadgeGeometry::cacheKey(type, size, startAngle, spanAngle, color1, color2);
 }
@@ -392,14 +362,12 @@ QPixmap BadgeDrawer::framePixmap(int startAngle, int spanAngle) const
 {
     const QString key = cacheKey(m_busyBadgeType, m_badgeSize, startAngle, spanAngle, m_busyColor1, m_busyColor2);
     QPixmap frame;
-    if (QPixmapCache::find(key, &frame))
-    {
+    if (QPixmapCache::find(key, &frame)) {
         return frame;
     }
-    frame = covering(renderBusyBadgePixmap(m_busyBadgeType, startAngle, spanAngle, m_busyColor1, m_busyColor2),
-                     m_badgeSize);
-    if (!frame.isNull())
-    {
+    frame = covering(
+        renderBusyBadgePixmap(m_busyBadgeType, startAngle, spanAngle, m_busyColor1, m_busyColor2), m_badgeSize);
+    if (!frame.isNull()) {
         QPixmapCache::insert(key, frame);
     }
     return frame;
@@ -407,8 +375,7 @@ QPixmap BadgeDrawer::framePixmap(int startAngle, int spanAngle) const
 
 void BadgeDrawer::refreshHost()
 {
-    if (m_widget)
-    {
+    if (m_widget) {
         m_widget->update();
         m_widget->updateGeometry();
     }

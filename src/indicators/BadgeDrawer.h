@@ -40,29 +40,29 @@ public:
     //! The look of the busy mark. Other numbers are accepted and give a fully transparent mark.
     enum EBusyBadgeType : int
     {
-        ebbtArc = 0,    //!< one thick open arc in the first busy colour
-        ebbtRing = 1,   //!< a closed ring with a turning conical gradient
-        ebbtDots = 2,   //!< eight discs coloured by a turning conical gradient
+        ebbtArc = 0, //!< one thick open arc in the first busy colour
+        ebbtRing = 1, //!< a closed ring with a turning conical gradient
+        ebbtDots = 2, //!< eight discs coloured by a turning conical gradient
         ebbtSpokes = 3, //!< twelve strokes coloured by a turning conical gradient
     };
     Q_ENUM(EBusyBadgeType)
 
     //! \a widget is the host; it may be null, and then nothing is drawn by drawBadge() and the animation
     //! does not care about visibility.
-    BadgeDrawer(QObject *parent, QWidget *widget);
+    BadgeDrawer(QObject* parent, QWidget* widget);
     ~BadgeDrawer() override;
 
     //! Changes the host; only stores it. A busy drawer watches the new host's visibility from the next
     //! setBadgeBusy(true) on.
-    void setBadgeWidget(QWidget *widget);
+    void setBadgeWidget(QWidget* widget);
 
     //! Shows \a text in a pill that covers \a size: as high as asked, or wider or higher if the text's
     //! proportions want it. Stops the animation but leaves badgeBusy() as it is: a busy drawer goes on
     //! spinning when its host is shown the next time. An empty text gives a plain disc.
-    void setBadgeLabel(const QString &text, const QSize &size, bool stroke, bool crossed);
+    void setBadgeLabel(const QString& text, const QSize& size, bool stroke, bool crossed);
 
     //! The same with badgeSize() and badgeStroke().
-    void setBadgeLabel(const QString &text, bool crossed);
+    void setBadgeLabel(const QString& text, bool crossed);
 
     //! Takes the badge away, busy mark included; badgeBusy() is left as it is.
     void unsetBadgeLabel();
@@ -77,7 +77,7 @@ public:
 
     //! Draws the pixmap as it is, aligned in the host's rectangle; in the host's coordinates. Left is left,
     //! whatever the host's layout direction. Draws nothing without a host.
-    void drawBadge(QPainter &painter, Qt::Alignment alignment);
+    void drawBadge(QPainter& painter, Qt::Alignment alignment);
 
     //! True while there is a pixmap, be it transparent.
     bool hasBadge() const;
@@ -92,32 +92,32 @@ public:
     // The setters only store. The change shows with the next setBadgeLabel(), setBadgeBusy(true) or tick.
     // A busy colour of the same QColor::value() as the old one may go on showing the old frames.
 
-    QSize badgeSize() const;             //!< default 20 x 20
-    void setBadgeSize(const QSize &size);
-    bool badgeStroke() const;            //!< outline the pill; default false
+    QSize badgeSize() const; //!< default 20 x 20
+    void setBadgeSize(const QSize& size);
+    bool badgeStroke() const; //!< outline the pill; default false
     void setBadgeStroke(bool stroke);
-    QColor badgeColor() const;           //!< text, outline and cross; default white
-    void setBadgeColor(const QColor &color);
-    QColor badgeBackground() const;      //!< the pill; default (246, 67, 70, 220)
-    void setBadgeBackground(const QColor &color);
-    QColor busyColor1() const;           //!< where the gradient starts; default white
-    void setBusyColor1(const QColor &color);
-    QColor busyColor2() const;           //!< where the gradient ends; default (192, 192, 192)
-    void setBusyColor2(const QColor &color);
+    QColor badgeColor() const; //!< text, outline and cross; default white
+    void setBadgeColor(const QColor& color);
+    QColor badgeBackground() const; //!< the pill; default (246, 67, 70, 220)
+    void setBadgeBackground(const QColor& color);
+    QColor busyColor1() const; //!< where the gradient starts; default white
+    void setBusyColor1(const QColor& color);
+    QColor busyColor2() const; //!< where the gradient ends; default (192, 192, 192)
+    void setBusyColor2(const QColor& color);
     EBusyBadgeType busyBadgeType() const; //!< default ebbtSpokes
     void setBusyBadgeType(EBusyBadgeType type);
 
     //! A pill 100 pixels high and as wide as the text wants, at least 100. Without a text, outline and cross
     //! use the whole disc.
-    static QPixmap renderBadgePixmapFromText(const QString &text, bool stroke, bool crossed,
-                                             const QColor &foreground, const QColor &background);
+    static QPixmap renderBadgePixmapFromText(
+        const QString& text, bool stroke, bool crossed, const QColor& foreground, const QColor& background);
 
     //! A busy mark of 100 x 100 pixels. \a startAngle and \a spanAngle in 1/16 degree, counter-clockwise;
     //! the span matters to ebbtArc only, which in turn ignores \a color2.
-    static QPixmap renderBusyBadgePixmap(EBusyBadgeType type, int startAngle, int spanAngle,
-                                         const QColor &color1, const QColor &color2);
+    static QPixmap renderBusyBadgePixmap(
+        EBusyBadgeType type, int startAngle, int spanAngle, const QColor& color1, const QColor& color2);
 
-    bool eventFilter(QObject *watched, QEvent *event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 Q_SIGNALS:
     //! The animation has moved on by a frame; currentPixmap() is the new one. Not emitted when a label or
@@ -128,8 +128,8 @@ private Q_SLOTS:
     void updateBusyBadge();
 
 private:
-    QString cacheKey(EBusyBadgeType type, const QSize &size, int startAngle, int spanAngle,
-                     const QColor &color1, const QColor &color2) const;
+    QString cacheKey(EBusyBadgeType type, const QSize& size, int startAngle, int spanAngle, const QColor& color1,
+        const QColor& color2) const;
     QPixmap framePixmap(int startAngle, int spanAngle) const;
     void refreshHost();
 

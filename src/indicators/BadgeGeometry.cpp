@@ -26,12 +26,12 @@ constexpr int LongestSide = 32767;
 constexpr qint64 MostPixels = qint64(4096) * 4096;
 constexpr double CosineOf45Degrees = 0.7071067811865476;
 
-QRect grown(const QRect &rect, int by)
+QRect grown(const QRect& rect, int by)
 {
     return rect.adjusted(-by, -by, by, by);
 }
 
-QRect shrunk(const QRect &rect, int by)
+QRect shrunk(const QRect& rect, int by)
 {
     return grown(rect, -by);
 }
@@ -39,23 +39,20 @@ QRect shrunk(const QRect &rect, int by)
 // The longest number has 11 characters; there are seven of them and six separators.
 constexpr int LongestKey = 7 * 11 + 6;
 
-QChar *appendNumber(QChar *out, int number)
+QChar* appendNumber(QChar* out, int number)
 {
     qint64 rest = number;
-    if (rest < 0)
-    {
+    if (rest < 0) {
         *out++ = QLatin1Char('-');
         rest = -rest;
     }
     QChar digits[10];
     int count = 0;
-    do
-    {
+    do {
         digits[count++] = QChar(ushort('0' + rest % 10));
         rest /= 10;
     } while (rest != 0);
-    while (count > 0)
-    {
+    while (count > 0) {
         *out++ = digits[--count];
     }
     return out;
@@ -100,12 +97,11 @@ std::array<QRect, DotCount> dotRects()
     const QPoint center = rect.center();
     const int radius = int(rect.width() * 0.5);
     std::array<QRect, DotCount> dots;
-    for (int i = 0; i < DotCount; ++i)
-    {
+    for (int i = 0; i < DotCount; ++i) {
         const double angle = i * M_PI / 4 + M_PI / 2;
         QRect dot(0, 0, DotExtent, DotExtent);
-        dot.moveCenter(QPoint(int(center.x() + radius * std::cos(angle)),
-                              int(center.y() - radius * std::sin(angle))));
+        dot.moveCenter(
+            QPoint(int(center.x() + radius * std::cos(angle)), int(center.y() - radius * std::sin(angle))));
         dots[size_t(i)] = dot;
     }
     return dots;
@@ -118,26 +114,25 @@ std::array<QLine, SpokeCount> spokeLines()
     const int outer = int(rect.width() * 0.5);
     const int inner = int(rect.width() * (1.0 / 3.0));
     std::array<QLine, SpokeCount> spokes;
-    for (int i = 0; i < SpokeCount; ++i)
-    {
+    for (int i = 0; i < SpokeCount; ++i) {
         const double angle = i * M_PI / 6 + M_PI / 2;
         const double cosine = std::cos(angle);
         const double sine = std::sin(angle);
         spokes[size_t(i)] = QLine(int(center.x() + outer * cosine), int(center.y() + outer * sine),
-                                  int(center.x() + inner * cosine), int(center.y() + inner * sine));
+            int(center.x() + inner * cosine), int(center.y() + inner * sine));
     }
     return spokes;
 }
 
-QString cacheKey(int type, const QSize &size, int startAngle, int spanAngle, const QColor &color1,
-                 const QColor &color2)
+QString cacheKey(
+    int type, const QSize& size, int startAngle, int spanAngle, const QColor& color1, const QColor& color2)
 {
     // Built on every tick of every spinner: a chain of QString::arg() would cost more than the repaint saves.
-    const int numbers[] = {type, size.width(), size.height(), startAngle, spanAngle, color1.value(), color2.value()};
+    const int numbers[]
+        = {type, size.width(), size.height(), startAngle, spanAngle, color1.value(), color2.value()};
     QChar key[LongestKey];
-    QChar *end = appendNumber(key, numbers[0]);
-    for (int i = 1; i < 7; ++i)
-    {
+    QChar* end = appendNumber(key, numbers[0]);
+    for (int i = 1; i < 7; ++i) {
         *end++ = QLatin1Char(i == 2 ? 'x' : '_');
         end = appendNumber(end, numbers[i]);
     }
@@ -152,8 +147,7 @@ int textRoomHeight(bool stroke)
 QRect pillRect(int textWidth, bool stroke)
 {
     QRect rect(0, 0, CanvasExtent, CanvasExtent);
-    if (stroke)
-    {
+    if (stroke) {
         rect = shrunk(rect, StrokeMargin);
     }
     const int widest = LongestSide - (stroke ? 2 * StrokeMargin : 0);
@@ -161,12 +155,12 @@ QRect pillRect(int textWidth, bool stroke)
     return stroke ? grown(rect, StrokeMargin) : rect;
 }
 
-QRect outlineRect(const QRect &pill, bool stroke)
+QRect outlineRect(const QRect& pill, bool stroke)
 {
     return stroke ? shrunk(pill, OutlineInset) : pill;
 }
 
-QLineF crossLine(const QRect &outline)
+QLineF crossLine(const QRect& outline)
 {
     const QRect rect = shrunk(outline, CrossMargin);
     const QPoint center = rect.center();
@@ -175,25 +169,22 @@ QLineF crossLine(const QRect &outline)
     return QLineF(center.x() - dx + 1, center.y() + dy + 1, center.x() + dx + 1, center.y() - dy + 1);
 }
 
-QRect textRect(const QRect &outline)
+QRect textRect(const QRect& outline)
 {
     return shrunk(outline, TextMargin);
 }
 
-QSize coveringSize(const QSize &canvas, const QSize &wanted)
+QSize coveringSize(const QSize& canvas, const QSize& wanted)
 {
-    if (canvas.isEmpty() || wanted.isEmpty())
-    {
+    if (canvas.isEmpty() || wanted.isEmpty()) {
         return QSize();
     }
-    if (wanted.width() > LongestSide || wanted.height() > LongestSide)
-    {
+    if (wanted.width() > LongestSide || wanted.height() > LongestSide) {
         return QSize();
     }
     const QSize size = canvas.scaled(wanted, Qt::KeepAspectRatioByExpanding).expandedTo(QSize(1, 1));
     if (size.width() > LongestSide || size.height() > LongestSide
-        || qint64(size.width()) * size.height() > MostPixels)
-    {
+        || qint64(size.width()) * size.height() > MostPixels) {
         return QSize();
     }
     return size;

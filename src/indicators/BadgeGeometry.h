@@ -25,12 +25,12 @@ namespace vx
 namespace BadgeGeometry
 {
 
-constexpr int CanvasExtent = 100;         //!< height of every canvas, and width of a busy mark's
-constexpr int FirstAngle = 90 * 16;       //!< start angle of the busy mark when it becomes busy, and of a still
-constexpr int ArcSpan = -270 * 16;        //!< span of the open arc; negative is clockwise
-constexpr int AngleStep = 30 * 16;        //!< what one tick takes off the start angle
-constexpr int FullTurn = 360 * 16;        //!< one turn
-constexpr int TickInterval = 50;          //!< milliseconds between two ticks: 12 ticks and 600 ms a turn
+constexpr int CanvasExtent = 100; //!< height of every canvas, and width of a busy mark's
+constexpr int FirstAngle = 90 * 16; //!< start angle of the busy mark when it becomes busy, and of a still
+constexpr int ArcSpan = -270 * 16; //!< span of the open arc; negative is clockwise
+constexpr int AngleStep = 30 * 16; //!< what one tick takes off the start angle
+constexpr int FullTurn = 360 * 16; //!< one turn
+constexpr int TickInterval = 50; //!< milliseconds between two ticks: 12 ticks and 600 ms a turn
 
 constexpr int DotCount = 8;
 constexpr int SpokeCount = 12;
@@ -65,8 +65,8 @@ ZELKOV_WIDGETS_EXPORT std::array<QLine, SpokeCount> spokeLines();
 //!
 //! Of the colours only QColor::value() counts, their HSV brightness: looks that differ in hue alone share
 //! their frames. Clients rely on the key, so it stays as it is.
-ZELKOV_WIDGETS_EXPORT QString cacheKey(int type, const QSize &size, int startAngle, int spanAngle,
-                                       const QColor &color1, const QColor &color2);
+ZELKOV_WIDGETS_EXPORT QString cacheKey(
+    int type, const QSize& size, int startAngle, int spanAngle, const QColor& color1, const QColor& color2);
 
 // Pill -----------------------------------------------------------------------------------------------------
 
@@ -79,13 +79,13 @@ ZELKOV_WIDGETS_EXPORT int textRoomHeight(bool stroke);
 ZELKOV_WIDGETS_EXPORT QRect pillRect(int textWidth, bool stroke);
 
 //! The rectangle of the outline, or of the pill itself without \a stroke; cross and text refer to it.
-ZELKOV_WIDGETS_EXPORT QRect outlineRect(const QRect &pill, bool stroke);
+ZELKOV_WIDGETS_EXPORT QRect outlineRect(const QRect& pill, bool stroke);
 
 //! The slash through a pill, from the lower left to the upper right; \a outline as from outlineRect().
-ZELKOV_WIDGETS_EXPORT QLineF crossLine(const QRect &outline);
+ZELKOV_WIDGETS_EXPORT QLineF crossLine(const QRect& outline);
 
 //! Where the text is centred; \a outline as from outlineRect().
-ZELKOV_WIDGETS_EXPORT QRect textRect(const QRect &outline);
+ZELKOV_WIDGETS_EXPORT QRect textRect(const QRect& outline);
 
 // Both -----------------------------------------------------------------------------------------------------
 
@@ -93,7 +93,7 @@ ZELKOV_WIDGETS_EXPORT QRect textRect(const QRect &outline);
 //!
 //! Empty if there is nothing to scale (an empty canvas or an empty wanted size) or if the result would be
 //! larger than any badge can sensibly be (a side over 32767 pixels or more than 16 million pixels in all).
-ZELKOV_WIDGETS_EXPORT QSize coveringSize(const QSize &canvas, const QSize &wanted);
+ZELKOV_WIDGETS_EXPORT QSize coveringSize(const QSize& canvas, const QSize& wanted);
 
 } // namespace BadgeGeometry
 } // namespace vx

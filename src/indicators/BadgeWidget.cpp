@@ -9,7 +9,7 @@
 namespace vx
 {
 
-BadgeWidget::BadgeWidget(QWidget *parent)
+BadgeWidget::BadgeWidget(QWidget* parent)
     : QWidget(parent)
     , m_badge(this, this)
     , m_alignment(Qt::AlignRight | Qt::AlignTop)
@@ -18,7 +18,7 @@ BadgeWidget::BadgeWidget(QWidget *parent)
 
 BadgeWidget::~BadgeWidget() = default;
 
-BadgeDrawer &BadgeWidget::badge()
+BadgeDrawer& BadgeWidget::badge()
 {
     return m_badge;
 }
@@ -30,8 +30,7 @@ Qt::Alignment BadgeWidget::alignment() const
 
 void BadgeWidget::setAlignment(Qt::Alignment alignment)
 {
-    if (m_alignment == alignment)
-    {
+    if (m_alignment == alignment) {
         return;
     }
     m_alignment = alignment;
@@ -53,7 +52,7 @@ QSize BadgeWidget::badgeSize() const
     return m_badge.badgeSize();
 }
 
-void BadgeWidget::setBadgeSize(const QSize &size)
+void BadgeWidget::setBadgeSize(const QSize& size)
 {
     m_badge.setBadgeSize(size);
 }
@@ -73,7 +72,7 @@ QColor BadgeWidget::badgeColor() const
     return m_badge.badgeColor();
 }
 
-void BadgeWidget::setBadgeColor(const QColor &color)
+void BadgeWidget::setBadgeColor(const QColor& color)
 {
     m_badge.setBadgeColor(color);
 }
@@ -83,7 +82,7 @@ QColor BadgeWidget::busyColor1() const
     return m_badge.busyColor1();
 }
 
-void BadgeWidget::setBusyColor1(const QColor &color)
+void BadgeWidget::setBusyColor1(const QColor& color)
 {
     m_badge.setBusyColor1(color);
 }
@@ -93,7 +92,7 @@ QColor BadgeWidget::busyColor2() const
     return m_badge.busyColor2();
 }
 
-void BadgeWidget::setBusyColor2(const QColor &color)
+void BadgeWidget::setBusyColor2(const QColor& color)
 {
     m_badge.setBusyColor2(color);
 }
@@ -103,7 +102,7 @@ QColor BadgeWidget::badgeBackground() const
     return m_badge.badgeBackground();
 }
 
-void BadgeWidget::setBadgeBackground(const QColor &color)
+void BadgeWidget::setBadgeBackground(const QColor& color)
 {
     m_badge.setBadgeBackground(color);
 }
@@ -113,7 +112,7 @@ void BadgeWidget::setBadgeBusy(bool on)
     m_badge.setBadgeBusy(on);
 }
 
-void BadgeWidget::setBadgeLabel(const QString &text)
+void BadgeWidget::setBadgeLabel(const QString& text)
 {
     m_badge.setBadgeLabel(text, false);
 }
@@ -133,7 +132,7 @@ QSize BadgeWidget::sizeHint() const
     return m_badge.sizeHint();
 }
 
-void BadgeWidget::paintEvent(QPaintEvent *)
+void BadgeWidget::paintEvent(QPaintEvent*)
 {
     QStyleOption option;
     option.initFrom(this);

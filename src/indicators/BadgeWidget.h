@@ -28,11 +28,11 @@ class ZELKOV_WIDGETS_EXPORT BadgeWidget : public QWidget
     Q_PROPERTY(QColor badgeBackground READ badgeBackground WRITE setBadgeBackground)
 
 public:
-    explicit BadgeWidget(QWidget *parent = nullptr);
+    explicit BadgeWidget(QWidget* parent = nullptr);
     ~BadgeWidget() override;
 
     //! The drawer, for what the widget does not forward. It lives as long as the widget.
-    BadgeDrawer &badge();
+    BadgeDrawer& badge();
 
     //! Where the badge stands in the widget; default right and top. Left is left in every layout direction.
     Qt::Alignment alignment() const;
@@ -41,22 +41,22 @@ public:
     int busyBadgeType() const; //!< BadgeDrawer::EBusyBadgeType as a number; unknown ones show nothing
     void setBusyBadgeType(int type);
     QSize badgeSize() const;
-    void setBadgeSize(const QSize &size);
+    void setBadgeSize(const QSize& size);
     bool badgeStroke() const;
     void setBadgeStroke(bool stroke);
     QColor badgeColor() const;
-    void setBadgeColor(const QColor &color);
+    void setBadgeColor(const QColor& color);
     QColor busyColor1() const;
-    void setBusyColor1(const QColor &color);
+    void setBusyColor1(const QColor& color);
     QColor busyColor2() const;
-    void setBusyColor2(const QColor &color);
+    void setBusyColor2(const QColor& color);
     QColor badgeBackground() const;
-    void setBadgeBackground(const QColor &color);
+    void setBadgeBackground(const QColor& color);
 
     void setBadgeBusy(bool on);
 
     //! Shows \a text, not struck through, with the size and the outline of the properties.
-    void setBadgeLabel(const QString &text);
+    void setBadgeLabel(const QString& text);
     QString badgeLabel() const;
     bool hasBadge() const;
 
@@ -64,7 +64,7 @@ public:
     QSize sizeHint() const override;
 
 protected:
-    void paintEvent(QPaintEvent *event) override;
+    void paintEvent(QPaintEvent* event) override;
 
 private:
     BadgeDrawer m_badge;
