@@ -1,0 +1,76 @@
+// SPDX-License-Identifier: MIT
+// The pages of the gallery. A new page gets its entry here.
+#include "PageList.h"
+
+#include <QtCore/QCoreApplication>
+
+#include "pages/BadgesPage.h"
+#include "pages/CameraWallPage.h"
+#include "pages/MouseGesturesPage.h"
+
+namespace gallery
+{
+namespace
+{
+template <class PageClass>
+Page* make(SignalLog& log, QWidget* parent)
+{
+    return new PageClass(log, parent);
+}
+
+QString translated(const char* text)
+{
+    return QCoreApplication::translate("gallery::PageList", text);
+}
+}
+
+const QVector<PageEntry>& pages()
+{
+    static const QVector<PageEntry> list = {
+        {"camera-wall", QT_TRANSLATE_NOOP("gallery::PageList", "Cameras"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Camera wall"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "Click selects a camera, double click enlarges it, a long press cuts its line, a "
+                           "slow drag looks around, a swipe turns to the next wall."),
+         &make<CameraWallPage>},
+        {"mouse-gestures", QT_TRANSLATE_NOOP("gallery::PageList", "Input"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Mouse gestures"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. "
+                           "Try the pad, and drag or flick the map below it."),
+         &make<MouseGesturesPage>},
+        {"badges", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Badges and spinners"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the "
+                           "same into any widget."),
+         &make<BadgesPage>},
+    };
+    return list;
+}
+
+int indexOfPage(const QString& name)
+{
+    for (int i = 0; i < pages().size(); ++i) {
+        if (name == QLatin1String(pages().at(i).name)) {
+            return i;
+        }
+    }
+    return -1;
+}
+
+QString PageEntry::familyText() const
+{
+    return translated(family);
+}
+
+QString PageEntry::titleText() const
+{
+    return translated(title);
+}
+
+QString PageEntry::descriptionText() const
+{
+    return translated(description);
+}
+}
