@@ -5,432 +5,432 @@
     <name>gallery::BadgesPage</name>
     <message>
         <source>Busy marks</source>
-        <translation type="unfinished"></translation>
+        <translation>Wartezeichen</translation>
     </message>
     <message>
         <source>Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>Bogen</translation>
     </message>
     <message>
         <source>Ring</source>
-        <translation type="unfinished"></translation>
+        <translation>Ring</translation>
     </message>
     <message>
         <source>Dots</source>
-        <translation type="unfinished"></translation>
+        <translation>Punkte</translation>
     </message>
     <message>
         <source>Spokes</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichen</translation>
     </message>
     <message>
         <source>Pills</source>
-        <translation type="unfinished"></translation>
+        <translation>Plaketten</translation>
     </message>
     <message>
         <source>Plain</source>
-        <translation type="unfinished"></translation>
+        <translation>Schlicht</translation>
     </message>
     <message>
         <source>Stroke</source>
-        <translation type="unfinished"></translation>
+        <translation>Umrandet</translation>
     </message>
     <message>
         <source>Crossed</source>
-        <translation type="unfinished"></translation>
+        <translation>Durchgestrichen</translation>
     </message>
     <message>
         <source>new</source>
-        <translation type="unfinished"></translation>
+        <translation>neu</translation>
     </message>
     <message>
         <source>In rows</source>
-        <translation type="unfinished"></translation>
+        <translation>In Zeilen</translation>
     </message>
     <message>
         <source>live</source>
-        <translation type="unfinished"></translation>
+        <translation>live</translation>
     </message>
     <message>
         <source>off</source>
-        <translation type="unfinished"></translation>
+        <translation>aus</translation>
     </message>
     <message>
         <source>Searching for cameras</source>
-        <translation type="unfinished"></translation>
+        <translation>Kameras werden gesucht</translation>
     </message>
     <message>
         <source>Unread alarms</source>
-        <translation type="unfinished"></translation>
+        <translation>Ungelesene Alarme</translation>
     </message>
     <message>
         <source>Main street</source>
-        <translation type="unfinished"></translation>
+        <translation>Hauptstraße</translation>
     </message>
     <message>
         <source>Car park</source>
-        <translation type="unfinished"></translation>
+        <translation>Parkplatz</translation>
     </message>
     <message>
         <source>Export is running</source>
-        <translation type="unfinished"></translation>
+        <translation>Export läuft</translation>
     </message>
     <message>
         <source>Alignment</source>
-        <translation type="unfinished"></translation>
+        <translation>Ausrichtung</translation>
     </message>
     <message>
         <source>Try it</source>
-        <translation type="unfinished"></translation>
+        <translation>Ausprobieren</translation>
     </message>
     <message>
         <source>Set the label</source>
-        <translation type="unfinished"></translation>
+        <translation>Text setzen</translation>
     </message>
     <message>
         <source>Set it crossed</source>
-        <translation type="unfinished"></translation>
+        <translation>Durchgestrichen setzen</translation>
     </message>
     <message>
         <source>Busy</source>
-        <translation type="unfinished"></translation>
+        <translation>Beschäftigt</translation>
     </message>
     <message>
         <source>Not busy</source>
-        <translation type="unfinished"></translation>
+        <translation>Nicht beschäftigt</translation>
     </message>
     <message>
         <source>No badge</source>
-        <translation type="unfinished"></translation>
+        <translation>Keine Plakette</translation>
     </message>
 </context>
 <context>
     <name>gallery::CameraTile</name>
     <message>
         <source>No signal</source>
-        <translation type="unfinished"></translation>
+        <translation>Kein Signal</translation>
     </message>
 </context>
 <context>
     <name>gallery::CameraWallPage</name>
     <message>
         <source>Main street</source>
-        <translation type="unfinished"></translation>
+        <translation>Hauptstraße</translation>
     </message>
     <message>
         <source>Reception</source>
-        <translation type="unfinished"></translation>
+        <translation>Empfang</translation>
     </message>
     <message>
         <source>Container yard</source>
-        <translation type="unfinished"></translation>
+        <translation>Containerhof</translation>
     </message>
     <message>
         <source>North gate</source>
-        <translation type="unfinished"></translation>
+        <translation>Nordtor</translation>
     </message>
     <message>
         <source>Corridor 1</source>
-        <translation type="unfinished"></translation>
+        <translation>Flur 1</translation>
     </message>
     <message>
         <source>Loading dock</source>
-        <translation type="unfinished"></translation>
+        <translation>Laderampe</translation>
     </message>
     <message>
         <source>Car park</source>
-        <translation type="unfinished"></translation>
+        <translation>Parkplatz</translation>
     </message>
     <message>
         <source>Staircase</source>
-        <translation type="unfinished"></translation>
+        <translation>Treppenhaus</translation>
     </message>
     <message>
         <source>Rail siding</source>
-        <translation type="unfinished"></translation>
+        <translation>Gleisanschluss</translation>
     </message>
     <message>
         <source>South gate</source>
-        <translation type="unfinished"></translation>
+        <translation>Südtor</translation>
     </message>
     <message>
         <source>Canteen</source>
-        <translation type="unfinished"></translation>
+        <translation>Kantine</translation>
     </message>
     <message>
         <source>Warehouse</source>
-        <translation type="unfinished"></translation>
+        <translation>Lagerhalle</translation>
     </message>
     <message>
         <source>Bus stop</source>
-        <translation type="unfinished"></translation>
+        <translation>Bushaltestelle</translation>
     </message>
     <message>
         <source>Corridor 2</source>
-        <translation type="unfinished"></translation>
+        <translation>Flur 2</translation>
     </message>
     <message>
         <source>Crane</source>
-        <translation type="unfinished"></translation>
+        <translation>Kran</translation>
     </message>
     <message>
         <source>Ring road</source>
-        <translation type="unfinished"></translation>
+        <translation>Ringstraße</translation>
     </message>
     <message>
         <source>Workshop</source>
-        <translation type="unfinished"></translation>
+        <translation>Werkstatt</translation>
     </message>
     <message>
         <source>Quay</source>
-        <translation type="unfinished"></translation>
+        <translation>Kai</translation>
     </message>
     <message>
         <source>Previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Zurück</translation>
     </message>
     <message>
         <source>Next</source>
-        <translation type="unfinished"></translation>
+        <translation>Weiter</translation>
     </message>
     <message>
         <source>Wall %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Wand %1 von %2</translation>
     </message>
     <message>
         <source>%1 frames per second   Without signal: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 Bilder pro Sekunde   Ohne Signal: %2</translation>
     </message>
 </context>
 <context>
     <name>gallery::GalleryWindow</name>
     <message>
         <source>Zelkov Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Zelkov-Galerie</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>Hell</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>Dunkel</translation>
     </message>
     <message>
         <source>None</source>
-        <translation type="unfinished"></translation>
+        <translation>Keines</translation>
     </message>
     <message>
         <source>Theme</source>
-        <translation type="unfinished"></translation>
+        <translation>Thema</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Sprache</translation>
     </message>
     <message>
         <source>Another scale starts the gallery anew.</source>
-        <translation type="unfinished"></translation>
+        <translation>Ein anderer Maßstab startet die Galerie neu.</translation>
     </message>
     <message>
         <source>Scale</source>
-        <translation type="unfinished"></translation>
+        <translation>Maßstab</translation>
     </message>
     <message>
         <source>Signals</source>
-        <translation type="unfinished"></translation>
+        <translation>Signale</translation>
     </message>
     <message>
         <source>Filter</source>
-        <translation type="unfinished"></translation>
+        <translation>Filtern</translation>
     </message>
     <message>
         <source>Fold repetitions</source>
-        <translation type="unfinished"></translation>
+        <translation>Wiederholungen zusammenfassen</translation>
     </message>
     <message>
         <source>Clear</source>
-        <translation type="unfinished"></translation>
+        <translation>Leeren</translation>
     </message>
 </context>
 <context>
     <name>gallery::GesturePad</name>
     <message>
         <source>Click, hold, drag or flick here</source>
-        <translation type="unfinished"></translation>
+        <translation>Hier klicken, halten, ziehen oder wischen</translation>
     </message>
 </context>
 <context>
     <name>gallery::MouseGesturesPage</name>
     <message>
         <source>Pressed</source>
-        <translation type="unfinished"></translation>
+        <translation>Gedrückt</translation>
     </message>
     <message>
         <source>Panning</source>
-        <translation type="unfinished"></translation>
+        <translation>Wird geschoben</translation>
     </message>
     <message>
         <source>Released</source>
-        <translation type="unfinished"></translation>
+        <translation>Losgelassen</translation>
     </message>
     <message>
         <source>Long press</source>
-        <translation type="unfinished"></translation>
+        <translation>Langes Drücken</translation>
     </message>
     <message>
         <source>Click</source>
-        <translation type="unfinished"></translation>
+        <translation>Klick</translation>
     </message>
     <message>
         <source>Double click</source>
-        <translation type="unfinished"></translation>
+        <translation>Doppelklick</translation>
     </message>
     <message>
         <source>Long click</source>
-        <translation type="unfinished"></translation>
+        <translation>Langer Klick</translation>
     </message>
     <message>
         <source>Auto click</source>
-        <translation type="unfinished"></translation>
+        <translation>Automatischer Klick</translation>
     </message>
     <message>
         <source>Swipe to the left</source>
-        <translation type="unfinished"></translation>
+        <translation>Wischen nach links</translation>
     </message>
     <message>
         <source>Swipe to the right</source>
-        <translation type="unfinished"></translation>
+        <translation>Wischen nach rechts</translation>
     </message>
     <message>
         <source>Swipe up</source>
-        <translation type="unfinished"></translation>
+        <translation>Wischen nach oben</translation>
     </message>
     <message>
         <source>Swipe down</source>
-        <translation type="unfinished"></translation>
+        <translation>Wischen nach unten</translation>
     </message>
     <message>
         <source>Pan to the left</source>
-        <translation type="unfinished"></translation>
+        <translation>Schieben nach links</translation>
     </message>
     <message>
         <source>Pan to the right</source>
-        <translation type="unfinished"></translation>
+        <translation>Schieben nach rechts</translation>
     </message>
     <message>
         <source>Pan up</source>
-        <translation type="unfinished"></translation>
+        <translation>Schieben nach oben</translation>
     </message>
     <message>
         <source>Pan down</source>
-        <translation type="unfinished"></translation>
+        <translation>Schieben nach unten</translation>
     </message>
     <message>
         <source>off</source>
-        <translation type="unfinished"></translation>
+        <translation>aus</translation>
     </message>
     <message>
         <source> ms</source>
-        <translation type="unfinished"></translation>
+        <translation> ms</translation>
     </message>
     <message>
         <source> px</source>
-        <translation type="unfinished"></translation>
+        <translation> px</translation>
     </message>
     <message>
         <source>Double click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Doppelklickzeit</translation>
     </message>
     <message>
         <source>Long click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeit für langen Klick</translation>
     </message>
     <message>
         <source>Auto click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Abstand automatischer Klicks</translation>
     </message>
     <message>
         <source>Swipe interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Wischzeit</translation>
     </message>
     <message>
         <source>Click radius</source>
-        <translation type="unfinished"></translation>
+        <translation>Klickradius</translation>
     </message>
     <message>
         <source>Double click radius</source>
-        <translation type="unfinished"></translation>
+        <translation>Doppelklickradius</translation>
     </message>
     <message>
         <source>Report hovering</source>
-        <translation type="unfinished"></translation>
+        <translation>Überfahren melden</translation>
     </message>
     <message>
         <source>Signals entered, moved and left, also without a button held</source>
-        <translation type="unfinished"></translation>
+        <translation>Signale entered, moved und left, auch ohne gedrückte Taste</translation>
     </message>
     <message>
         <source>Settings of the pad</source>
-        <translation type="unfinished"></translation>
+        <translation>Einstellungen der Fläche</translation>
     </message>
 </context>
 <context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
-        <translation type="unfinished"></translation>
+        <translation>Kameras</translation>
     </message>
     <message>
         <source>Camera wall</source>
-        <translation type="unfinished"></translation>
+        <translation>Kamerawand</translation>
     </message>
     <message>
         <source>Click selects a camera, double click enlarges it, a long press cuts its line, a slow drag looks around, a swipe turns to the next wall.</source>
-        <translation type="unfinished"></translation>
+        <translation>Ein Klick wählt eine Kamera, ein Doppelklick vergrößert sie, langes Drücken kappt ihre Leitung, langsames Ziehen schaut umher, Wischen blättert zur nächsten Wand.</translation>
     </message>
     <message>
         <source>Input</source>
-        <translation type="unfinished"></translation>
+        <translation>Eingabe</translation>
     </message>
     <message>
         <source>Mouse gestures</source>
-        <translation type="unfinished"></translation>
+        <translation>Mausgesten</translation>
     </message>
     <message>
         <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the map below it.</source>
-        <translation type="unfinished"></translation>
+        <translation>MouseAdapter macht aus rohen Mausereignissen Klicks, langes Drücken, Schieben und Wischen. Die Fläche lädt zum Ausprobieren ein; das Bild darunter lässt sich ziehen und anstoßen.</translation>
     </message>
     <message>
         <source>Indicators</source>
-        <translation type="unfinished"></translation>
+        <translation>Anzeigen</translation>
     </message>
     <message>
         <source>Badges and spinners</source>
-        <translation type="unfinished"></translation>
+        <translation>Plaketten und Wartezeichen</translation>
     </message>
     <message>
         <source>BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the same into any widget.</source>
-        <translation type="unfinished"></translation>
+        <translation>BadgeWidget zeigt einen kurzen Text in einer Plakette oder ein Wartezeichen; BadgeDrawer malt dasselbe in jedes Widget.</translation>
     </message>
 </context>
 <context>
     <name>gallery::SignalLog</name>
     <message>
         <source>Time</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeit</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objekt</translation>
     </message>
     <message>
         <source>Signal</source>
-        <translation type="unfinished"></translation>
+        <translation>Signal</translation>
     </message>
     <message>
         <source>Arguments</source>
-        <translation type="unfinished"></translation>
+        <translation>Argumente</translation>
     </message>
 </context>
 </TS>

@@ -5,432 +5,432 @@
     <name>gallery::BadgesPage</name>
     <message>
         <source>Busy marks</source>
-        <translation type="unfinished"></translation>
+        <translation>Indicateurs d’activité</translation>
     </message>
     <message>
         <source>Arc</source>
-        <translation type="unfinished"></translation>
+        <translation>Arc</translation>
     </message>
     <message>
         <source>Ring</source>
-        <translation type="unfinished"></translation>
+        <translation>Anneau</translation>
     </message>
     <message>
         <source>Dots</source>
-        <translation type="unfinished"></translation>
+        <translation>Points</translation>
     </message>
     <message>
         <source>Spokes</source>
-        <translation type="unfinished"></translation>
+        <translation>Rayons</translation>
     </message>
     <message>
         <source>Pills</source>
-        <translation type="unfinished"></translation>
+        <translation>Pastilles</translation>
     </message>
     <message>
         <source>Plain</source>
-        <translation type="unfinished"></translation>
+        <translation>Simple</translation>
     </message>
     <message>
         <source>Stroke</source>
-        <translation type="unfinished"></translation>
+        <translation>Avec contour</translation>
     </message>
     <message>
         <source>Crossed</source>
-        <translation type="unfinished"></translation>
+        <translation>Barré</translation>
     </message>
     <message>
         <source>new</source>
-        <translation type="unfinished"></translation>
+        <translation>neuf</translation>
     </message>
     <message>
         <source>In rows</source>
-        <translation type="unfinished"></translation>
+        <translation>Dans des lignes</translation>
     </message>
     <message>
         <source>live</source>
-        <translation type="unfinished"></translation>
+        <translation>direct</translation>
     </message>
     <message>
         <source>off</source>
-        <translation type="unfinished"></translation>
+        <translation>non</translation>
     </message>
     <message>
         <source>Searching for cameras</source>
-        <translation type="unfinished"></translation>
+        <translation>Recherche de caméras</translation>
     </message>
     <message>
         <source>Unread alarms</source>
-        <translation type="unfinished"></translation>
+        <translation>Alarmes non lues</translation>
     </message>
     <message>
         <source>Main street</source>
-        <translation type="unfinished"></translation>
+        <translation>Rue principale</translation>
     </message>
     <message>
         <source>Car park</source>
-        <translation type="unfinished"></translation>
+        <translation>Parking</translation>
     </message>
     <message>
         <source>Export is running</source>
-        <translation type="unfinished"></translation>
+        <translation>Export en cours</translation>
     </message>
     <message>
         <source>Alignment</source>
-        <translation type="unfinished"></translation>
+        <translation>Alignement</translation>
     </message>
     <message>
         <source>Try it</source>
-        <translation type="unfinished"></translation>
+        <translation>À essayer</translation>
     </message>
     <message>
         <source>Set the label</source>
-        <translation type="unfinished"></translation>
+        <translation>Fixer le texte</translation>
     </message>
     <message>
         <source>Set it crossed</source>
-        <translation type="unfinished"></translation>
+        <translation>Fixer barré</translation>
     </message>
     <message>
         <source>Busy</source>
-        <translation type="unfinished"></translation>
+        <translation>Occupé</translation>
     </message>
     <message>
         <source>Not busy</source>
-        <translation type="unfinished"></translation>
+        <translation>Libre</translation>
     </message>
     <message>
         <source>No badge</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucune pastille</translation>
     </message>
 </context>
 <context>
     <name>gallery::CameraTile</name>
     <message>
         <source>No signal</source>
-        <translation type="unfinished"></translation>
+        <translation>Pas de signal</translation>
     </message>
 </context>
 <context>
     <name>gallery::CameraWallPage</name>
     <message>
         <source>Main street</source>
-        <translation type="unfinished"></translation>
+        <translation>Rue principale</translation>
     </message>
     <message>
         <source>Reception</source>
-        <translation type="unfinished"></translation>
+        <translation>Accueil</translation>
     </message>
     <message>
         <source>Container yard</source>
-        <translation type="unfinished"></translation>
+        <translation>Cour des conteneurs</translation>
     </message>
     <message>
         <source>North gate</source>
-        <translation type="unfinished"></translation>
+        <translation>Porte nord</translation>
     </message>
     <message>
         <source>Corridor 1</source>
-        <translation type="unfinished"></translation>
+        <translation>Couloir 1</translation>
     </message>
     <message>
         <source>Loading dock</source>
-        <translation type="unfinished"></translation>
+        <translation>Quai de chargement</translation>
     </message>
     <message>
         <source>Car park</source>
-        <translation type="unfinished"></translation>
+        <translation>Parking</translation>
     </message>
     <message>
         <source>Staircase</source>
-        <translation type="unfinished"></translation>
+        <translation>Escalier</translation>
     </message>
     <message>
         <source>Rail siding</source>
-        <translation type="unfinished"></translation>
+        <translation>Voie de garage</translation>
     </message>
     <message>
         <source>South gate</source>
-        <translation type="unfinished"></translation>
+        <translation>Porte sud</translation>
     </message>
     <message>
         <source>Canteen</source>
-        <translation type="unfinished"></translation>
+        <translation>Cantine</translation>
     </message>
     <message>
         <source>Warehouse</source>
-        <translation type="unfinished"></translation>
+        <translation>Entrepôt</translation>
     </message>
     <message>
         <source>Bus stop</source>
-        <translation type="unfinished"></translation>
+        <translation>Arrêt de bus</translation>
     </message>
     <message>
         <source>Corridor 2</source>
-        <translation type="unfinished"></translation>
+        <translation>Couloir 2</translation>
     </message>
     <message>
         <source>Crane</source>
-        <translation type="unfinished"></translation>
+        <translation>Grue</translation>
     </message>
     <message>
         <source>Ring road</source>
-        <translation type="unfinished"></translation>
+        <translation>Périphérique</translation>
     </message>
     <message>
         <source>Workshop</source>
-        <translation type="unfinished"></translation>
+        <translation>Atelier</translation>
     </message>
     <message>
         <source>Quay</source>
-        <translation type="unfinished"></translation>
+        <translation>Embarcadère</translation>
     </message>
     <message>
         <source>Previous</source>
-        <translation type="unfinished"></translation>
+        <translation>Précédent</translation>
     </message>
     <message>
         <source>Next</source>
-        <translation type="unfinished"></translation>
+        <translation>Suivant</translation>
     </message>
     <message>
         <source>Wall %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Mur %1 sur %2</translation>
     </message>
     <message>
         <source>%1 frames per second   Without signal: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 images par seconde   Sans signal : %2</translation>
     </message>
 </context>
 <context>
     <name>gallery::GalleryWindow</name>
     <message>
         <source>Zelkov Gallery</source>
-        <translation type="unfinished"></translation>
+        <translation>Galerie Zelkov</translation>
     </message>
     <message>
         <source>Light</source>
-        <translation type="unfinished"></translation>
+        <translation>Clair</translation>
     </message>
     <message>
         <source>Dark</source>
-        <translation type="unfinished"></translation>
+        <translation>Sombre</translation>
     </message>
     <message>
         <source>None</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun</translation>
     </message>
     <message>
         <source>Theme</source>
-        <translation type="unfinished"></translation>
+        <translation>Thème</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Langue</translation>
     </message>
     <message>
         <source>Another scale starts the gallery anew.</source>
-        <translation type="unfinished"></translation>
+        <translation>Une autre échelle redémarre la galerie.</translation>
     </message>
     <message>
         <source>Scale</source>
-        <translation type="unfinished"></translation>
+        <translation>Échelle</translation>
     </message>
     <message>
         <source>Signals</source>
-        <translation type="unfinished"></translation>
+        <translation>Signaux</translation>
     </message>
     <message>
         <source>Filter</source>
-        <translation type="unfinished"></translation>
+        <translation>Filtrer</translation>
     </message>
     <message>
         <source>Fold repetitions</source>
-        <translation type="unfinished"></translation>
+        <translation>Regrouper les répétitions</translation>
     </message>
     <message>
         <source>Clear</source>
-        <translation type="unfinished"></translation>
+        <translation>Effacer</translation>
     </message>
 </context>
 <context>
     <name>gallery::GesturePad</name>
     <message>
         <source>Click, hold, drag or flick here</source>
-        <translation type="unfinished"></translation>
+        <translation>Cliquez, maintenez, glissez ou balayez ici</translation>
     </message>
 </context>
 <context>
     <name>gallery::MouseGesturesPage</name>
     <message>
         <source>Pressed</source>
-        <translation type="unfinished"></translation>
+        <translation>Appuyé</translation>
     </message>
     <message>
         <source>Panning</source>
-        <translation type="unfinished"></translation>
+        <translation>Déplacement</translation>
     </message>
     <message>
         <source>Released</source>
-        <translation type="unfinished"></translation>
+        <translation>Relâché</translation>
     </message>
     <message>
         <source>Long press</source>
-        <translation type="unfinished"></translation>
+        <translation>Appui long</translation>
     </message>
     <message>
         <source>Click</source>
-        <translation type="unfinished"></translation>
+        <translation>Clic</translation>
     </message>
     <message>
         <source>Double click</source>
-        <translation type="unfinished"></translation>
+        <translation>Double clic</translation>
     </message>
     <message>
         <source>Long click</source>
-        <translation type="unfinished"></translation>
+        <translation>Clic long</translation>
     </message>
     <message>
         <source>Auto click</source>
-        <translation type="unfinished"></translation>
+        <translation>Clic automatique</translation>
     </message>
     <message>
         <source>Swipe to the left</source>
-        <translation type="unfinished"></translation>
+        <translation>Balayage vers la gauche</translation>
     </message>
     <message>
         <source>Swipe to the right</source>
-        <translation type="unfinished"></translation>
+        <translation>Balayage vers la droite</translation>
     </message>
     <message>
         <source>Swipe up</source>
-        <translation type="unfinished"></translation>
+        <translation>Balayage vers le haut</translation>
     </message>
     <message>
         <source>Swipe down</source>
-        <translation type="unfinished"></translation>
+        <translation>Balayage vers le bas</translation>
     </message>
     <message>
         <source>Pan to the left</source>
-        <translation type="unfinished"></translation>
+        <translation>Déplacement vers la gauche</translation>
     </message>
     <message>
         <source>Pan to the right</source>
-        <translation type="unfinished"></translation>
+        <translation>Déplacement vers la droite</translation>
     </message>
     <message>
         <source>Pan up</source>
-        <translation type="unfinished"></translation>
+        <translation>Déplacement vers le haut</translation>
     </message>
     <message>
         <source>Pan down</source>
-        <translation type="unfinished"></translation>
+        <translation>Déplacement vers le bas</translation>
     </message>
     <message>
         <source>off</source>
-        <translation type="unfinished"></translation>
+        <translation>non</translation>
     </message>
     <message>
         <source> ms</source>
-        <translation type="unfinished"></translation>
+        <translation> ms</translation>
     </message>
     <message>
         <source> px</source>
-        <translation type="unfinished"></translation>
+        <translation> px</translation>
     </message>
     <message>
         <source>Double click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Délai du double clic</translation>
     </message>
     <message>
         <source>Long click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Délai du clic long</translation>
     </message>
     <message>
         <source>Auto click interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Délai du clic auto</translation>
     </message>
     <message>
         <source>Swipe interval</source>
-        <translation type="unfinished"></translation>
+        <translation>Délai du balayage</translation>
     </message>
     <message>
         <source>Click radius</source>
-        <translation type="unfinished"></translation>
+        <translation>Rayon du clic</translation>
     </message>
     <message>
         <source>Double click radius</source>
-        <translation type="unfinished"></translation>
+        <translation>Rayon du double clic</translation>
     </message>
     <message>
         <source>Report hovering</source>
-        <translation type="unfinished"></translation>
+        <translation>Signaler le survol</translation>
     </message>
     <message>
         <source>Signals entered, moved and left, also without a button held</source>
-        <translation type="unfinished"></translation>
+        <translation>Signaux entered, moved et left, même sans bouton enfoncé</translation>
     </message>
     <message>
         <source>Settings of the pad</source>
-        <translation type="unfinished"></translation>
+        <translation>Réglages de la surface</translation>
     </message>
 </context>
 <context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
-        <translation type="unfinished"></translation>
+        <translation>Caméras</translation>
     </message>
     <message>
         <source>Camera wall</source>
-        <translation type="unfinished"></translation>
+        <translation>Mur de caméras</translation>
     </message>
     <message>
         <source>Click selects a camera, double click enlarges it, a long press cuts its line, a slow drag looks around, a swipe turns to the next wall.</source>
-        <translation type="unfinished"></translation>
+        <translation>Un clic sélectionne une caméra, un double clic l’agrandit, un appui long coupe sa liaison, un glissement lent oriente la vue, un balayage passe au mur suivant.</translation>
     </message>
     <message>
         <source>Input</source>
-        <translation type="unfinished"></translation>
+        <translation>Saisie</translation>
     </message>
     <message>
         <source>Mouse gestures</source>
-        <translation type="unfinished"></translation>
+        <translation>Gestes de la souris</translation>
     </message>
     <message>
         <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the map below it.</source>
-        <translation type="unfinished"></translation>
+        <translation>MouseAdapter transforme les événements bruts de la souris en clics, appuis longs, déplacements et balayages. Essayez la surface, puis glissez ou lancez l’image au-dessous.</translation>
     </message>
     <message>
         <source>Indicators</source>
-        <translation type="unfinished"></translation>
+        <translation>Indicateurs</translation>
     </message>
     <message>
         <source>Badges and spinners</source>
-        <translation type="unfinished"></translation>
+        <translation>Pastilles et indicateurs d’activité</translation>
     </message>
     <message>
         <source>BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the same into any widget.</source>
-        <translation type="unfinished"></translation>
+        <translation>BadgeWidget affiche un texte court dans une pastille ou un indicateur d’activité ; BadgeDrawer les peint dans n’importe quel widget.</translation>
     </message>
 </context>
 <context>
     <name>gallery::SignalLog</name>
     <message>
         <source>Time</source>
-        <translation type="unfinished"></translation>
+        <translation>Heure</translation>
     </message>
     <message>
         <source>Object</source>
-        <translation type="unfinished"></translation>
+        <translation>Objet</translation>
     </message>
     <message>
         <source>Signal</source>
-        <translation type="unfinished"></translation>
+        <translation>Signal</translation>
     </message>
     <message>
         <source>Arguments</source>
-        <translation type="unfinished"></translation>
+        <translation>Arguments</translation>
     </message>
 </context>
 </TS>
