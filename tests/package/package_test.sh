@@ -144,13 +144,19 @@ headers() {
     local list
     list=$(cd "$include" && find . -name '*.h' | sed 's#^\./##' | sort)
     [ "$(echo "$list" | wc -l)" -ge 4 ] || fail "too few headers in $include"
-    export CXX flags
+    local probes=$ZELKOV_SCRATCH/headers header launcher
+    rm -rf "$probes"
+    mkdir -p "$probes"
+    for header in $list; do
+        printf '#include "%s"\n#include "%s"\n' "$header" "$header" > "$probes/${header//\//_}.cpp"
+    done
+    launcher=$(command -v ccache || true)
+    export CXX flags launcher
     # shellcheck disable=SC2016
-    echo "$list" | xargs -P 2 -I '{}' sh -c '
-        printf "#include \"%s\"\n#include \"%s\"\n" "{}" "{}" \
-            | "$CXX" -std=c++17 -fPIC -fsyntax-only -Wall -Wextra -Wshadow -Wconversion -Werror \
-                -DQT_NO_KEYWORDS -DQT_NO_CAST_FROM_ASCII $flags -x c++ - \
-            || { echo "{} does not compile alone"; exit 255; }' || fail "a header does not compile alone"
+    find "$probes" -name '*.cpp' | sort | xargs -P 2 -I '{}' sh -c '
+        $launcher "$CXX" -std=c++17 -fPIC -Wall -Wextra -Wshadow -Wconversion -Werror \
+            -DQT_NO_KEYWORDS -DQT_NO_CAST_FROM_ASCII $flags -c "{}" -o "{}.o" || exit 255' \
+        || fail "a header does not compile alone"
     echo "$(echo "$list" | wc -l) headers compile alone"
 }
 
