@@ -29,23 +29,31 @@ constexpr int FrameCount = 12;
 constexpr int WallColumns = 8;
 constexpr int HourInMilliseconds = 3600000;
 
-// The floor: twelve ready pixmaps, and nothing else.
+// The floor: twelve ready pixmaps, shared by all, and nothing else.
 class ReadyPixmaps : public QWidget
 {
 public:
     explicit ReadyPixmaps(QWidget* parent)
         : QWidget(parent)
+        , m_frames(frames())
         , m_timer(this)
     {
-        for (int i = 0; i < FrameCount; ++i) {
-            m_frames << vx::BadgeDrawer::renderBusyBadgePixmap(
-                vx::BadgeDrawer::ebbtSpokes, -480 * i, -4320, Qt::white, QColor(192, 192, 192))
-                            .scaled(Extent, Extent, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
-        }
         connect(&m_timer, &QTimer::timeout, this, [this] {
             m_index = (m_index + 1) % FrameCount;
             update();
         });
+    }
+
+private:
+    static QVector<QPixmap> frames()
+    {
+        static QVector<QPixmap>& shared = *new QVector<QPixmap>; // outlives the application, never destroyed
+        for (int i = shared.size(); i < FrameCount; ++i) {
+            shared << vx::BadgeDrawer::renderBusyBadgePixmap(
+                vx::BadgeDrawer::ebbtSpokes, -480 * i, -4320, Qt::white, QColor(192, 192, 192))
+                          .scaled(Extent, Extent, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+        }
+        return shared;
     }
 
 protected:
@@ -162,7 +170,7 @@ public:
             QTimerEvent event(timer->timerId());
             QCoreApplication::sendEvent(timer, &event);
         }
-        QCoreApplication::sendPostedEvents(&m_window, QEvent::UpdateRequest);
+        QCoreApplication::sendPostedEvents();
     }
 
     // Seconds for a batch of steps.

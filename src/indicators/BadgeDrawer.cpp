@@ -2,8 +2,6 @@
 // Rendering of pills and busy marks, and the state of one badge.
 #include "indicators/BadgeDrawer.h"
 
-#include "indicators/BadgeGeometry.h"
-
 #include <QConicalGradient>
 #include <QEvent>
 #include <QFont>
@@ -112,7 +110,7 @@ void BadgeDrawer::setBadgeBusy(bool on)
         m_label.clear();
         m_busyAngle = BadgeGeometry::FirstAngle;
         m_busyFrame = 0;
-        m_pixmap = framePixmap(m_busyAngle, m_busySpan);
+        showFrame();
         if (!m_widget) {
             m_busyTimer.start();
         } else {
@@ -165,7 +163,12 @@ QSize BadgeDrawer::sizeHint() const
 
 QPixmap BadgeDrawer::busyPixmap()
 {
-    return framePixmap(BadgeGeometry::FirstAngle, BadgeGeometry::ArcSpan);
+    constexpr int angle = BadgeGeometry::FirstAngle;
+    constexpr int span = BadgeGeometry::ArcSpan;
+    QPixmap frame;
+    fetchFrame(
+        cacheKey(m_busyBadgeType, m_badgeSize, angle, span, m_busyColor1, m_busyColor2), angle, span, frame);
+    return frame;
 }
 
 QSize BadgeDrawer::badgeSize() const
@@ -176,6 +179,7 @@ QSize BadgeDrawer::badgeSize() const
 void BadgeDrawer::setBadgeSize(const QSize& size)
 {
     m_badgeSize = size;
+    forgetKeys();
 }
 
 bool BadgeDrawer::badgeStroke() const
@@ -216,6 +220,7 @@ QColor BadgeDrawer::busyColor1() const
 void BadgeDrawer::setBusyColor1(const QColor& color)
 {
     m_busyColor1 = color;
+    forgetKeys();
 }
 
 QColor BadgeDrawer::busyColor2() const
@@ -226,6 +231,7 @@ QColor BadgeDrawer::busyColor2() const
 void BadgeDrawer::setBusyColor2(const QColor& color)
 {
     m_busyColor2 = color;
+    forgetKeys();
 }
 
 BadgeDrawer::EBusyBadgeType BadgeDrawer::busyBadgeType() const
@@ -236,6 +242,7 @@ BadgeDrawer::EBusyBadgeType BadgeDrawer::busyBadgeType() const
 void BadgeDrawer::setBusyBadgeType(EBusyBadgeType type)
 {
     m_busyBadgeType = type;
+    forgetKeys();
 }
 
 QPixmap BadgeDrawer::renderBadgePixmapFromText(
@@ -345,7 +352,7 @@ bool BadgeDrawer::eventFilter(QObject* watched, QEvent* event)
 void BadgeDrawer::updateBusyBadge()
 {
     m_busyAngle = BadgeGeometry::nextAngle(m_busyAngle);
-    m_pixmap = framePixmap(m_busyAngle, m_busySpan);
+    showFrame();
     if (m_widget) {
         m_widget->update();
     }
@@ -358,19 +365,31 @@ QString BadgeDrawer::cacheKey(EBusyBadgeType type, const QSize& size, int startA
     return BadgeGeometry::cacheKey(type, size, startAngle, spanAngle, color1, color2);
 }
 
-QPixmap BadgeDrawer::framePixmap(int startAngle, int spanAngle) const
+void BadgeDrawer::fetchFrame(const QString& key, int startAngle, int spanAngle, QPixmap& frame) const
 {
-    const QString key = cacheKey(m_busyBadgeType, m_badgeSize, startAngle, spanAngle, m_busyColor1, m_busyColor2);
-    QPixmap frame;
     if (QPixmapCache::find(key, &frame)) {
-        return frame;
+        return;
     }
     frame = covering(
         renderBusyBadgePixmap(m_busyBadgeType, startAngle, spanAngle, m_busyColor1, m_busyColor2), m_badgeSize);
     if (!frame.isNull()) {
         QPixmapCache::insert(key, frame);
     }
-    return frame;
+}
+
+void BadgeDrawer::showFrame()
+{
+    // Spelling the key takes longer than the look-up, and this happens for every spinner on every tick.
+    QString& key = m_frameKeys[size_t(BadgeGeometry::angleIndex(m_busyAngle))];
+    if (key.isEmpty()) {
+        key = cacheKey(m_busyBadgeType, m_badgeSize, m_busyAngle, m_busySpan, m_busyColor1, m_busyColor2);
+    }
+    fetchFrame(key, m_busyAngle, m_busySpan, m_pixmap);
+}
+
+void BadgeDrawer::forgetKeys()
+{
+    m_frameKeys.fill(QString());
 }
 
 void BadgeDrawer::refreshHost()

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "foundation/Export.h"
+#include "indicators/BadgeGeometry.h"
 
 #include <QColor>
 #include <QObject>
@@ -12,6 +13,8 @@
 #include <QString>
 #include <QTimer>
 #include <QWidget>
+
+#include <array>
 
 class QPainter;
 
@@ -130,7 +133,9 @@ private Q_SLOTS:
 private:
     QString cacheKey(EBusyBadgeType type, const QSize& size, int startAngle, int spanAngle, const QColor& color1,
         const QColor& color2) const;
-    QPixmap framePixmap(int startAngle, int spanAngle) const;
+    void fetchFrame(const QString& key, int startAngle, int spanAngle, QPixmap& frame) const;
+    void showFrame();
+    void forgetKeys();
     void refreshHost();
 
     QPointer<QWidget> m_widget;
@@ -148,6 +153,9 @@ private:
     int m_busySpan;
     int m_busyFrame;
     QTimer m_busyTimer;
+
+    // The keys of the running animation's frames, made when they are first needed and forgotten by the setters.
+    std::array<QString, BadgeGeometry::AngleCount> m_frameKeys;
 };
 
 } // namespace vx

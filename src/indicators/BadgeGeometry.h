@@ -32,6 +32,9 @@ constexpr int AngleStep = 30 * 16; //!< what one tick takes off the start angle
 constexpr int FullTurn = 360 * 16; //!< one turn
 constexpr int TickInterval = 50; //!< milliseconds between two ticks: 12 ticks and 600 ms a turn
 
+//! How many start angles there are: three of the first turn and the twelve that recur.
+constexpr int AngleCount = (FirstAngle + FullTurn) / AngleStep;
+
 constexpr int DotCount = 8;
 constexpr int SpokeCount = 12;
 
@@ -39,6 +42,9 @@ constexpr int SpokeCount = 12;
 
 //! The start angle that follows \a angle. Once past zero it stays in -5760 < angle <= 0.
 ZELKOV_WIDGETS_EXPORT int nextAngle(int angle);
+
+//! The place of \a angle among the AngleCount angles that nextAngle() goes through, 0 for the lowest.
+ZELKOV_WIDGETS_EXPORT int angleIndex(int angle);
 
 //! The conical gradient's angle in whole degrees for \a startAngle (1/16 degree), truncated toward zero.
 ZELKOV_WIDGETS_EXPORT int gradientAngle(int startAngle);
