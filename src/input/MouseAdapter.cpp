@@ -74,6 +74,10 @@ MouseAdapter::MouseAdapter(QWidget* parent, bool filterEvents)
     , m_longClickInterval(longClickDefault)
     , m_autoClickInterval(autoClickDefault)
 {
+    // A queued connection made by signature text does not register them by itself.
+    qRegisterMetaType<vx::MouseEvent>("vx::MouseEvent");
+    qRegisterMetaType<vx::MouseGesture::Ptr>("vx::MouseGesture::Ptr");
+
     m_doubleClickTimer.setSingleShot(true);
     m_doubleClickTimer.setInterval(m_doubleClickInterval);
     m_longClickTimer.setSingleShot(true);
