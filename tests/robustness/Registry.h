@@ -75,6 +75,7 @@ std::vector<Entry> platformEntries();
 std::vector<Entry> foundationEntries();
 std::vector<Entry> indicatorsEntries();
 std::vector<Entry> inputEntries();
+std::vector<Entry> slidersEntries();
 
 // --- Words for entries -----------------------------------------------------------------------------------------
 
