@@ -8,6 +8,7 @@
 #include <QtCore/QProcess>
 #include <QtCore/QSortFilterProxyModel>
 #include <QtGui/QFontDatabase>
+#include <QtGui/QScreen>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QCheckBox>
 #include <QtWidgets/QComboBox>
@@ -17,6 +18,7 @@
 #include <QtWidgets/QLineEdit>
 #include <QtWidgets/QListWidget>
 #include <QtWidgets/QPushButton>
+#include <QtWidgets/QScrollArea>
 #include <QtWidgets/QScrollBar>
 #include <QtWidgets/QSplitter>
 #include <QtWidgets/QTableView>
@@ -33,6 +35,10 @@ const zelkov::theme::Name s_themes[] = {zelkov::theme::Name::Light, zelkov::them
                                         zelkov::theme::Name::None};
 const char* const s_scales[] = {"1", "1.25", "1.5", "2"};
 const int s_pageRole = Qt::UserRole;
+const QSize s_size(1240, 900);
+const int s_margin = 20;
+const int s_logRowHeight = 22;
+const int s_logRows = 5;
 
 QLabel* roleLabel(const char* role)
 {
@@ -45,7 +51,10 @@ QLabel* roleLabel(const char* role)
 GalleryWindow::GalleryWindow(SignalLog& log, QWidget* parent)
     : QMainWindow(parent), m_log(log)
 {
-    resize(1180, 780);
+    const QScreen* first = QGuiApplication::primaryScreen();
+    const QSize room = first ? first->availableSize() : s_size;
+    const bool isOffscreen = QGuiApplication::platformName() == QLatin1String("offscreen");
+    resize(s_size.boundedTo(isOffscreen ? s_size : room * 95 / 100));
 }
 
 GalleryWindow::~GalleryWindow() = default;
@@ -127,18 +136,23 @@ void GalleryWindow::rebuild()
     m_description = roleLabel("hint");
     m_description->setWordWrap(true);
     m_pageLayout = new QVBoxLayout(pagePanel);
-    m_pageLayout->setContentsMargins(20, 16, 20, 12);
+    m_pageLayout->setContentsMargins(s_margin, 16, s_margin, 12);
     m_pageLayout->setSpacing(4);
     m_pageLayout->addWidget(m_title);
     m_pageLayout->addWidget(m_description);
     m_pageLayout->addSpacing(8);
+    m_scroll = new QScrollArea;
+    m_scroll->setProperty("role", QStringLiteral("plain"));
+    m_scroll->setFrameShape(QFrame::NoFrame);
+    m_scroll->setWidgetResizable(true);
+    m_pageLayout->addWidget(m_scroll, 1);
 
     auto* upright = new QSplitter(Qt::Vertical);
     upright->addWidget(pagePanel);
     upright->addWidget(makeLog());
     upright->setStretchFactor(0, 1);
     upright->setStretchFactor(1, 0);
-    upright->setSizes({600, 170});
+    upright->setSizes({10000, 1});
     upright->setChildrenCollapsible(false);
 
     auto* body = new QWidget;
@@ -170,7 +184,7 @@ QWidget* GalleryWindow::makeTopBar()
     auto* bar = new QFrame;
     bar->setProperty("role", QStringLiteral("bar"));
     auto* layout = new QHBoxLayout(bar);
-    layout->setContentsMargins(20, 8, 20, 8);
+    layout->setContentsMargins(s_margin, 8, s_margin, 8);
     layout->setSpacing(8);
     auto* name = roleLabel("heading");
     name->setText(tr("Zelkov Gallery"));
@@ -225,7 +239,7 @@ QWidget* GalleryWindow::makePageList()
     m_list = new QListWidget;
     m_list->setProperty("role", QStringLiteral("sidebar"));
     m_list->setFrameShape(QFrame::NoFrame);
-    m_list->setFixedWidth(200);
+    m_list->setFixedWidth(236);
     m_list->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     QString family;
     for (int i = 0; i < pages().size(); ++i) {
@@ -235,9 +249,11 @@ QWidget* GalleryWindow::makePageList()
             auto* heading = new QListWidgetItem(family, m_list);
             heading->setFlags(Qt::NoItemFlags);
             heading->setData(s_pageRole, -1);
+            heading->setSizeHint(QSize(0, 36));
         }
         auto* item = new QListWidgetItem(entry.titleText(), m_list);
         item->setData(s_pageRole, i);
+        item->setSizeHint(QSize(0, 32));
     }
     connect(m_list, &QListWidget::currentItemChanged, this, [this](QListWidgetItem* item) {
         const int index = item ? item->data(s_pageRole).toInt() : -1;
@@ -273,7 +289,7 @@ QWidget* GalleryWindow::makeLog()
     table->setWordWrap(false);
     table->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     table->verticalHeader()->hide();
-    table->verticalHeader()->setDefaultSectionSize(22);
+    table->verticalHeader()->setDefaultSectionSize(s_logRowHeight);
     table->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     table->horizontalHeader()->setStretchLastSection(true);
     table->horizontalHeader()->setHighlightSections(false);
@@ -303,11 +319,14 @@ QWidget* GalleryWindow::makeLog()
     row->addWidget(filter);
     row->addWidget(clear);
     auto* layout = new QVBoxLayout(box);
-    layout->setContentsMargins(20, 4, 20, 16);
+    layout->setContentsMargins(s_margin, 4, s_margin, 16);
     layout->setSpacing(8);
     layout->addLayout(row);
     layout->addWidget(table);
-    box->setMinimumHeight(140);
+    // Whole rows, so that the end of the list does not stand below half a row.
+    table->ensurePolished();
+    table->setMinimumHeight(table->horizontalHeader()->sizeHint().height() + s_logRows * s_logRowHeight
+                            + 2 * table->frameWidth());
     return box;
 }
 
@@ -322,7 +341,7 @@ void GalleryWindow::showPage(int index)
     m_title->setText(entry.titleText());
     m_description->setText(entry.descriptionText());
     m_page = entry.make(m_log, nullptr);
-    m_pageLayout->addWidget(m_page, 1);
+    m_scroll->setWidget(m_page);
     for (int row = 0; row < m_list->count(); ++row) {
         if (m_list->item(row)->data(s_pageRole).toInt() == index) {
             m_list->setCurrentRow(row);

@@ -11,6 +11,7 @@
 class QComboBox;
 class QLabel;
 class QListWidget;
+class QScrollArea;
 class QTableView;
 class QVBoxLayout;
 
@@ -58,6 +59,7 @@ private:
     QLabel* m_title = nullptr;
     QLabel* m_description = nullptr;
     QVBoxLayout* m_pageLayout = nullptr;
+    QScrollArea* m_scroll = nullptr;
     QPointer<Page> m_page;
 };
 }

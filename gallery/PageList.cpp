@@ -37,7 +37,7 @@ const QVector<PageEntry>& pages()
          QT_TRANSLATE_NOOP("gallery::PageList", "Mouse gestures"),
          QT_TRANSLATE_NOOP("gallery::PageList",
                            "MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. "
-                           "Try the pad, and drag or flick the map below it."),
+                           "Try the pad, and drag or flick the picture below it."),
          &make<MouseGesturesPage>},
         {"badges", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Badges and spinners"),

@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Set it crossed</source>
-        <translation>Durchgestrichen setzen</translation>
+        <translation>Durchstreichen</translation>
     </message>
     <message>
         <source>Busy</source>
@@ -97,11 +97,19 @@
     </message>
     <message>
         <source>Not busy</source>
-        <translation>Nicht beschäftigt</translation>
+        <translation>Fertig</translation>
     </message>
     <message>
         <source>No badge</source>
         <translation>Keine Plakette</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Colours</source>
+        <translation>Farben</translation>
     </message>
 </context>
 <context>
@@ -398,10 +406,6 @@
         <translation>Mausgesten</translation>
     </message>
     <message>
-        <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the map below it.</source>
-        <translation>MouseAdapter macht aus rohen Mausereignissen Klicks, langes Drücken, Schieben und Wischen. Die Fläche lädt zum Ausprobieren ein; das Bild darunter lässt sich ziehen und anstoßen.</translation>
-    </message>
-    <message>
         <source>Indicators</source>
         <translation>Anzeigen</translation>
     </message>
@@ -412,6 +416,10 @@
     <message>
         <source>BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the same into any widget.</source>
         <translation>BadgeWidget zeigt einen kurzen Text in einer Plakette oder ein Wartezeichen; BadgeDrawer malt dasselbe in jedes Widget.</translation>
+    </message>
+    <message>
+        <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the picture below it.</source>
+        <translation>MouseAdapter macht aus rohen Mausereignissen Klicks, langes Drücken, Schieben und Wischen. Die Fläche lädt zum Ausprobieren ein; das Bild darunter lässt sich ziehen und anstoßen.</translation>
     </message>
 </context>
 <context>

@@ -85,11 +85,11 @@
     </message>
     <message>
         <source>Set the label</source>
-        <translation>Fixer le texte</translation>
+        <translation>Fixer</translation>
     </message>
     <message>
         <source>Set it crossed</source>
-        <translation>Fixer barré</translation>
+        <translation>Barrer</translation>
     </message>
     <message>
         <source>Busy</source>
@@ -102,6 +102,14 @@
     <message>
         <source>No badge</source>
         <translation>Aucune pastille</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Colours</source>
+        <translation>Couleurs</translation>
     </message>
 </context>
 <context>
@@ -398,20 +406,20 @@
         <translation>Gestes de la souris</translation>
     </message>
     <message>
-        <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the map below it.</source>
-        <translation>MouseAdapter transforme les événements bruts de la souris en clics, appuis longs, déplacements et balayages. Essayez la surface, puis glissez ou lancez l’image au-dessous.</translation>
-    </message>
-    <message>
         <source>Indicators</source>
         <translation>Indicateurs</translation>
     </message>
     <message>
         <source>Badges and spinners</source>
-        <translation>Pastilles et indicateurs d’activité</translation>
+        <translation>Pastilles et attente</translation>
     </message>
     <message>
         <source>BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the same into any widget.</source>
         <translation>BadgeWidget affiche un texte court dans une pastille ou un indicateur d’activité ; BadgeDrawer les peint dans n’importe quel widget.</translation>
+    </message>
+    <message>
+        <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the picture below it.</source>
+        <translation>MouseAdapter transforme les événements bruts de la souris en clics, appuis longs, déplacements et balayages. Essayez la surface, puis glissez ou lancez l’image au-dessous.</translation>
     </message>
 </context>
 <context>

@@ -26,6 +26,37 @@ QString systemLanguage()
     return gallery::GalleryWindow::languages().contains(language) ? language : QStringLiteral("en");
 }
 
+// Without a desktop there are no settings to take a font from, and the platform talks about hints it ignores.
+QtMessageHandler s_nextHandler = nullptr;
+
+void dropNoise(QtMsgType type, const QMessageLogContext& context, const QString& message)
+{
+    if (!message.contains(QLatin1String("propagateSizeHints"))) {
+        s_nextHandler(type, context, message);
+    }
+}
+
+void settleWithoutDesktop()
+{
+    s_nextHandler = qInstallMessageHandler(dropNoise);
+    QFont font(QStringLiteral("DejaVu Sans"));
+    font.setPixelSize(13);
+    QApplication::setFont(font);
+}
+
+// Pictures and lists need no display; only a window to use does.
+void doWithoutDisplay(int argc, char* argv[])
+{
+    const bool hasDisplay = qEnvironmentVariableIsSet("DISPLAY") || qEnvironmentVariableIsSet("WAYLAND_DISPLAY")
+        || qEnvironmentVariableIsSet("QT_QPA_PLATFORM");
+    for (int i = 1; i < argc && !hasDisplay; ++i) {
+        const QByteArray argument(argv[i]);
+        if (argument.startsWith("--shots") || argument == "--list" || argument == "--help") {
+            qputenv("QT_QPA_PLATFORM", "offscreen");
+        }
+    }
+}
+
 void listPages()
 {
     QTextStream out(stdout);
@@ -38,9 +69,15 @@ void listPages()
 
 int main(int argc, char* argv[])
 {
-    QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+    doWithoutDisplay(argc, argv);
     QCoreApplication::setAttribute(Qt::AA_UseHighDpiPixmaps);
-    QGuiApplication::setHighDpiScaleFactorRoundingPolicy(Qt::HighDpiScaleFactorRoundingPolicy::PassThrough);
+    if (!qgetenv("QT_QPA_PLATFORM").startsWith("offscreen")) {
+        // The screen that is none reports 100 dpi, and everything would stand between pixels.
+        QCoreApplication::setAttribute(Qt::AA_EnableHighDpiScaling);
+#if QT_VERSION >= QT_VERSION_CHECK(5, 14, 0)
+        QGuiApplication::setHighDpiScaleFactorRoundingPolicy(Qt::HighDpiScaleFactorRoundingPolicy::PassThrough);
+#endif
+    }
     QApplication application(argc, argv);
     QCoreApplication::setApplicationName(QStringLiteral("zelkov-gallery"));
 
@@ -84,6 +121,9 @@ int main(int argc, char* argv[])
         return fail(QStringLiteral("there is no language '%1'; it is en, de or fr").arg(parser.value(language)));
     }
 
+    if (QGuiApplication::platformName() == QLatin1String("offscreen")) {
+        settleWithoutDesktop();
+    }
     gallery::SignalLog log;
     if (parser.isSet(logFile) && !log.openFile(parser.value(logFile))) {
         return fail(QStringLiteral("cannot write '%1'").arg(parser.value(logFile)));

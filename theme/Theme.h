@@ -24,6 +24,7 @@ enum class Name : int
 ///
 /// Beside the classes it knows a property "role" with which a program says what a plain widget is for:
 ///   panel      a bordered surface that holds other widgets
+///   plain      a scroll area without a frame or a ground of its own
 ///   bar        a tool bar along the edge of a window
 ///   sidebar    the list on the left of a window
 ///   title      the heading of a page         heading    the heading of a panel

@@ -25,6 +25,7 @@ vx::BadgeWidget* spinner(int look, int size, const QColor& first, const QColor& 
 {
     auto* badge = new vx::BadgeWidget(nullptr);
     badge->setAlignment(Qt::AlignCenter);
+    badge->setFixedSize(size, size);
     badge->setBusyBadgeType(look);
     badge->setBadgeSize(QSize(size, size));
     badge->setBusyColor1(first);
@@ -81,26 +82,32 @@ QWidget* BadgesPage::makeLooks()
     QVBoxLayout* layout = column(box, label(tr("Busy marks"), "heading"));
     auto* grid = new QGridLayout;
     grid->setHorizontalSpacing(18);
-    grid->setVerticalSpacing(8);
+    grid->setVerticalSpacing(4);
     const QString names[] = {tr("Arc"), tr("Ring"), tr("Dots"), tr("Spokes")};
-    const int sizes[] = {16, 24, 32, 48};
+    const int sizes[] = {16, 24, 32, 40};
+    for (int i = 0; i < 4; ++i) {
+        grid->addWidget(label(tr("%1 px").arg(sizes[i]), "hint"), 0, i + 1, Qt::AlignCenter);
+    }
+    grid->addWidget(label(tr("Colours"), "hint"), 0, 5, Qt::AlignCenter);
     const QColor text = palette().color(QPalette::WindowText);
     QColor clear = text;
     clear.setAlpha(20);
     for (int look = 0; look < 4; ++look) {
-        grid->addWidget(label(names[look], "hint"), look, 0);
+        grid->addWidget(label(names[look]), look + 1, 0);
         int place = 1;
         for (const int size : sizes) {
-            grid->addWidget(spinner(look, size, text, clear), look, place++, Qt::AlignCenter);
+            grid->addWidget(spinner(look, size, text, clear), look + 1, place++, Qt::AlignCenter);
         }
         // Frames are cached by the brightness of the colours, so no two of these share it.
         const QColor colors[] = {s_blue, s_green, s_amber, s_grey};
         QColor end = colors[look];
         end.setAlpha(20);
-        grid->addWidget(spinner(look, 40, colors[look], end), look, place, Qt::AlignCenter);
-        grid->setRowMinimumHeight(look, 50);
+        grid->addWidget(spinner(look, 32, colors[look], end), look + 1, place, Qt::AlignCenter);
+        grid->setRowMinimumHeight(look + 1, 42);
     }
-    grid->setColumnStretch(0, 1);
+    for (int i = 0; i < 6; ++i) {
+        grid->setColumnStretch(i, 1);
+    }
     layout->addLayout(grid);
     return box;
 }
@@ -109,9 +116,15 @@ QWidget* BadgesPage::makePills()
 {
     QWidget* box = panel();
     QVBoxLayout* layout = column(box, label(tr("Pills"), "heading"));
-    auto* grid = new QGridLayout;
+    // Pills are made to lie on a picture, so they get a dark ground in every theme.
+    auto* ground = new QFrame;
+    ground->setObjectName(QStringLiteral("pillGround"));
+    ground->setStyleSheet(QStringLiteral("#pillGround { background: #2b3646; border-radius: 6px; border: none; }"
+                                         "#pillGround QLabel { color: #d5dce6; }"));
+    auto* grid = new QGridLayout(ground);
+    grid->setContentsMargins(14, 10, 14, 10);
     grid->setHorizontalSpacing(12);
-    grid->setVerticalSpacing(10);
+    grid->setVerticalSpacing(8);
     struct Line
     {
         QString name;
@@ -123,16 +136,17 @@ QWidget* BadgesPage::makePills()
     };
     for (int row = 0; row < 3; ++row) {
         const Line& line = lines[row];
-        grid->addWidget(label(line.name, "hint"), row, 0);
-        grid->addWidget(pill(QString(), 26, QColor(), line.stroke, line.crossed), row, 1);
-        grid->addWidget(pill(QStringLiteral("3"), 26, QColor(), line.stroke, line.crossed), row, 2);
-        grid->addWidget(pill(QStringLiteral("42"), 26, s_blue, line.stroke, line.crossed), row, 3);
-        grid->addWidget(pill(QStringLiteral("128"), 26, s_green, line.stroke, line.crossed), row, 4);
-        grid->addWidget(pill(tr("new"), 26, s_amber, line.stroke, line.crossed), row, 5);
+        grid->addWidget(label(line.name), row, 0);
+        grid->addWidget(pill(QString(), 26, QColor(), line.stroke, line.crossed), row, 1, Qt::AlignCenter);
+        grid->addWidget(pill(QStringLiteral("3"), 26, QColor(), line.stroke, line.crossed), row, 2, Qt::AlignCenter);
+        grid->addWidget(pill(QStringLiteral("42"), 26, s_blue, line.stroke, line.crossed), row, 3, Qt::AlignCenter);
+        grid->addWidget(pill(QStringLiteral("128"), 26, s_green, line.stroke, line.crossed), row, 4, Qt::AlignCenter);
+        grid->addWidget(pill(tr("new"), 26, s_amber, line.stroke, line.crossed), row, 5, Qt::AlignCenter);
     }
-    grid->setColumnStretch(0, 1);
-    layout->addLayout(grid);
-    layout->addStretch(1);
+    for (int i = 0; i < 6; ++i) {
+        grid->setColumnStretch(i, 1);
+    }
+    layout->addWidget(ground, 1);
     return box;
 }
 
@@ -140,6 +154,7 @@ QWidget* BadgesPage::makeRows()
 {
     QWidget* box = panel();
     QVBoxLayout* layout = column(box, label(tr("In rows"), "heading"));
+    layout->setSpacing(15);
     const QColor text = palette().color(QPalette::WindowText);
     QColor clear = text;
     clear.setAlpha(20);
@@ -193,7 +208,7 @@ QWidget* BadgesPage::makeTry()
     m_badge = new vx::BadgeWidget(nullptr);
     m_badge->setAlignment(Qt::AlignCenter);
     m_badge->setBadgeSize(QSize(36, 36));
-    m_badge->setMinimumSize(90, 40);
+    m_badge->setFixedSize(100, 40);
     const QColor text = palette().color(QPalette::WindowText);
     QColor clear = text;
     clear.setAlpha(20);
@@ -204,7 +219,7 @@ QWidget* BadgesPage::makeTry()
 
     auto* field = new QLineEdit(QStringLiteral("7"));
     field->setMaxLength(8);
-    field->setFixedWidth(140);
+    field->setFixedWidth(110);
     auto* set = new QPushButton(tr("Set the label"));
     auto* cross = new QPushButton(tr("Set it crossed"));
     auto* busy = new QPushButton(tr("Busy"));

@@ -2,6 +2,7 @@
 // Page "Camera wall": moving pictures that are used with the mouse.
 #pragma once
 
+#include <QtCore/QElapsedTimer>
 #include <QtCore/QTimer>
 
 #include "../Page.h"
@@ -39,6 +40,7 @@ private:
     QLabel* m_state;
     QTimer m_frames;
     QTimer m_second;
+    QElapsedTimer m_since;
     int m_frameCount = 0;
     int m_framesPerSecond = 25;
 };

@@ -2,7 +2,8 @@
 // The pad shows what each signal of its adapter means; the map is moved with the adapter's scroll helpers.
 #include "MouseGesturesPage.h"
 
-#include <QtGui/QPainter>
+#include <functional>
+
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QCheckBox>
 #include <QtWidgets/QFormLayout>
@@ -94,7 +95,8 @@ void MouseGesturesPage::connectPad()
 QWidget* MouseGesturesPage::makeSettings()
 {
     QWidget* box = panel();
-    box->setFixedWidth(310);
+    box->setMinimumWidth(280);
+    box->setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Preferred);
     auto* form = new QFormLayout;
     form->setHorizontalSpacing(12);
     form->setVerticalSpacing(8);
@@ -151,13 +153,13 @@ QWidget* MouseGesturesPage::makeMap()
 {
     auto* picture = new QLabel;
     picture->setObjectName(QStringLiteral("map"));
-    picture->setPixmap(Scene(2).ground(QSize(1500, 720), devicePixelRatioF()));
+    picture->setPixmap(Scene(0).ground(QSize(1100, 420), devicePixelRatioF()));
     m_map = new QScrollArea;
     m_map->setWidget(picture);
     m_map->setMinimumHeight(90);
     m_map->setCursor(Qt::OpenHandCursor);
-    m_map->horizontalScrollBar()->setValue(300);
-    m_map->verticalScrollBar()->setValue(280);
+    m_map->horizontalScrollBar()->setValue(260);
+    m_map->verticalScrollBar()->setValue(110);
 
     auto* mouse = new vx::MouseAdapter(picture, true);
     mouse->setMouseTracking(false);

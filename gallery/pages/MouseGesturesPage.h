@@ -2,8 +2,6 @@
 // Page "Mouse gestures": MouseAdapter on a pad and on a scroll area.
 #pragma once
 
-#include <functional>
-
 #include "../Page.h"
 #include "input/MouseAdapter.h"
 

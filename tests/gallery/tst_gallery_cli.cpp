@@ -67,6 +67,8 @@ private Q_SLOTS:
     void shotsIntoAnImpossibleFolderFail();
     void rehearsalLogsTheSignalsOfRealEvents();
     void textsFollowTheLanguage();
+    void cataloguesAreComplete_data();
+    void cataloguesAreComplete();
     void badOptionsFailWithAMessage_data();
     void badOptionsFailWithAMessage();
     void sheetsHaveNoWordLeftUnfilled_data();
@@ -175,6 +177,34 @@ void TestGalleryCli::textsFollowTheLanguage()
     QVERIFY(pictures.at(0) != pictures.at(1));
     QVERIFY(pictures.at(0) != pictures.at(2));
     QVERIFY(pictures.at(1) != pictures.at(2));
+}
+
+void TestGalleryCli::cataloguesAreComplete_data()
+{
+    QTest::addColumn<QString>("name");
+    QTest::newRow("de") << QStringLiteral("gallery_de.ts");
+    QTest::newRow("fr") << QStringLiteral("gallery_fr.ts");
+}
+
+void TestGalleryCli::cataloguesAreComplete()
+{
+    QFETCH(QString, name);
+    QTemporaryDir folder;
+    const QString copy = folder.filePath(name);
+    QVERIFY(QFile::copy(QStringLiteral(GALLERY_FOLDER "/") + name, copy));
+    QProcess lupdate;
+    lupdate.start(QStringLiteral(LUPDATE_PROGRAM), {QStringLiteral("-silent"), QStringLiteral("-locations"),
+                                                    QStringLiteral("none"), QStringLiteral(GALLERY_FOLDER),
+                                                    QStringLiteral("-ts"), copy});
+    QVERIFY(lupdate.waitForFinished(30000));
+    QCOMPARE(lupdate.exitCode(), 0);
+    QFile file(copy);
+    QVERIFY(file.open(QIODevice::ReadOnly));
+    const QByteArray text = file.readAll();
+    QVERIFY(text.count("<source>") > 50);
+    QCOMPARE(text.count("type=\"unfinished\""), 0);
+    QCOMPARE(text.count("type=\"vanished\""), 0);
+    QCOMPARE(text.count("<translation></translation>"), 0);
 }
 
 void TestGalleryCli::badOptionsFailWithAMessage_data()
