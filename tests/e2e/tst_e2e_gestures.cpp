@@ -202,7 +202,8 @@ void TestE2eGestures::longPressIsReportedWhileHeldAndLongClickOnRelease()
     forget();
     pointer(to(inPad(0.5, 0.6)) + QStringList{word("sleep"), word("0.05"), word("mousedown"), word("1")});
     COMPARE_PAD(word("pressed"), word("longPressed"));
-    pointer({word("mouseup"), word("1")});
+    // A release right at the border may still be a click, since timers may come a little early.
+    pointer({word("sleep"), word("0.2"), word("mouseup"), word("1")});
     COMPARE_PAD(word("pressed"), word("longPressed"), word("released"), word("longClicked"), word("finished"));
 }
 
