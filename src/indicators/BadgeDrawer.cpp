@@ -9,6 +9,7 @@
 #include <QPainter>
 #include <QPen>
 #include <QPixmapCache>
+#include <QSet>
 #include <QStyle>
 
 namespace vx
@@ -43,6 +44,17 @@ QPixmap covering(const QPixmap& canvas, const QSize& wanted)
         return QPixmap();
     }
     return canvas.scaled(wanted, Qt::KeepAspectRatioByExpanding, Qt::SmoothTransformation);
+}
+
+// One copy of each key for all drawers of a look: a wall of spinners then stays within the processor's cache.
+QString sharedKey(const QString& key)
+{
+    constexpr int mostKeys = 512;
+    static QSet<QString> keys;
+    if (keys.size() >= mostKeys) {
+        keys.clear();
+    }
+    return *keys.insert(key);
 }
 
 } // namespace
@@ -142,8 +154,13 @@ void BadgeDrawer::drawBadge(QPainter& painter, Qt::Alignment alignment)
     if (!m_widget || m_pixmap.isNull() || !painter.isActive()) {
         return;
     }
-    const QRect target = QStyle::alignedRect(Qt::LeftToRight, alignment, m_pixmap.size(), m_widget->rect());
-    painter.drawPixmap(target.topLeft(), m_pixmap);
+    const QRect room = m_widget->rect();
+    const QSize size = m_pixmap.size();
+    // A host of the badge's own size, as layouts make it, has only one place for it.
+    const QPoint place = room.size() == size
+        ? room.topLeft()
+        : QStyle::alignedRect(Qt::LeftToRight, alignment, size, room).topLeft();
+    painter.drawPixmap(place, m_pixmap);
 }
 
 bool BadgeDrawer::hasBadge() const
@@ -382,7 +399,8 @@ void BadgeDrawer::showFrame()
     // Spelling the key takes longer than the look-up, and this happens for every spinner on every tick.
     QString& key = m_frameKeys[size_t(BadgeGeometry::angleIndex(m_busyAngle))];
     if (key.isEmpty()) {
-        key = cacheKey(m_busyBadgeType, m_badgeSize, m_busyAngle, m_busySpan, m_busyColor1, m_busyColor2);
+        key = sharedKey(
+            cacheKey(m_busyBadgeType, m_badgeSize, m_busyAngle, m_busySpan, m_busyColor1, m_busyColor2));
     }
     fetchFrame(key, m_busyAngle, m_busySpan, m_pixmap);
 }

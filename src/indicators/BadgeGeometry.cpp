@@ -66,11 +66,6 @@ int nextAngle(int angle)
     return (angle - AngleStep) % FullTurn;
 }
 
-int angleIndex(int angle)
-{
-    return (angle + FullTurn) / AngleStep - 1;
-}
-
 int gradientAngle(int startAngle)
 {
     return startAngle / 16;

@@ -44,7 +44,10 @@ constexpr int SpokeCount = 12;
 ZELKOV_WIDGETS_EXPORT int nextAngle(int angle);
 
 //! The place of \a angle among the AngleCount angles that nextAngle() goes through, 0 for the lowest.
-ZELKOV_WIDGETS_EXPORT int angleIndex(int angle);
+constexpr int angleIndex(int angle)
+{
+    return (angle + FullTurn) / AngleStep - 1;
+}
 
 //! The conical gradient's angle in whole degrees for \a startAngle (1/16 degree), truncated toward zero.
 ZELKOV_WIDGETS_EXPORT int gradientAngle(int startAngle);

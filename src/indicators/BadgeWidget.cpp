@@ -18,7 +18,16 @@ namespace
 // but takes about as long to find out as a whole frame of a spinner takes to draw.
 bool paintsWidgets(const QStyle& style)
 {
-    return std::strcmp(style.metaObject()->className(), "QFusionStyle") != 0;
+    static const QMetaObject* fusion = nullptr;
+    const QMetaObject* const meta = style.metaObject();
+    if (meta == fusion) {
+        return false;
+    }
+    if (std::strcmp(meta->className(), "QFusionStyle") != 0) {
+        return true;
+    }
+    fusion = meta;
+    return false;
 }
 
 } // namespace

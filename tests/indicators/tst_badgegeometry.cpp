@@ -19,6 +19,7 @@ class TestBadgeGeometry : public zelkovtest::TestCase
 private Q_SLOTS:
     void anglesFollowTheTruncatingRemainder();
     void aTurnHasTwelveFrames();
+    void everyAngleHasAnIndexOfItsOwn();
     void gradientAnglesTruncateTowardZero_data();
     void gradientAnglesTruncateTowardZero();
     void rectanglesShareTheIntegerCentre();
@@ -60,6 +61,16 @@ void TestBadgeGeometry::aTurnHasTwelveFrames()
     for (int i = 1; i <= 12; ++i) {
         angle = geometry::nextAngle(angle);
         QCOMPARE(angle == 0, i == 12);
+    }
+}
+
+void TestBadgeGeometry::everyAngleHasAnIndexOfItsOwn()
+{
+    QCOMPARE(geometry::AngleCount, 15);
+    int angle = geometry::FirstAngle;
+    for (int expected : {14, 13, 12, 11, 10, 9, 8, 7, 6, 5, 4, 3, 2, 1, 0, 11, 10}) {
+        QCOMPARE(geometry::angleIndex(angle), expected);
+        angle = geometry::nextAngle(angle);
     }
 }
 

@@ -5,9 +5,12 @@
 #include "TestMain.h"
 
 #include <QtCore/QMetaProperty>
+#include <QtGui/QPainter>
 #include <QtGui/QPixmapCache>
 #include <QtTest/QtTest>
 #include <QtWidgets/QHBoxLayout>
+#include <QtWidgets/QProxyStyle>
+#include <QtWidgets/QStyleOption>
 
 #include <memory>
 
@@ -64,6 +67,7 @@ private Q_SLOTS:
     void rightIsRightInEveryLayoutDirection();
     void alignmentShowsAtOnce();
     void paintsTheStyleSheetBackground();
+    void letsTheStylePaintTheWidget();
     void paintsWithoutABadge();
     void hiddenSpinnerSleeps();
     void widgetMayDieInItsDrawersSignal();
@@ -363,6 +367,32 @@ void TestBadgeWidget::paintsTheStyleSheetBackground()
     QCOMPARE(image.pixelColor(1, 20), QColor(Qt::yellow));
     QCOMPARE(image.pixelColor(20, 25), QColor(0, 128, 0));
     QVERIFY(image.pixelColor(50, 10).red() > 180);
+}
+
+void TestBadgeWidget::letsTheStylePaintTheWidget()
+{
+    class Style : public QProxyStyle
+    {
+    public:
+        void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
+            const QWidget* widget) const override
+        {
+            if (element == PE_Widget) {
+                painter->fillRect(option->rect, Qt::green);
+            } else {
+                QProxyStyle::drawPrimitive(element, option, painter, widget);
+            }
+        }
+    } style;
+    BadgeWidget widget(nullptr);
+    widget.resize(60, 40);
+    widget.setBadgeLabel(QString());
+    QCOMPARE(rendered(widget).pixelColor(10, 10).alpha(), 0);
+    widget.setStyle(&style);
+    QCOMPARE(rendered(widget).pixelColor(10, 10), QColor(Qt::green));
+    QVERIFY(rendered(widget).pixelColor(50, 10).red() > 180);
+    widget.setStyle(nullptr);
+    QCOMPARE(rendered(widget).pixelColor(10, 10).alpha(), 0);
 }
 
 void TestBadgeWidget::paintsWithoutABadge()
