@@ -1,0 +1,254 @@
+// SPDX-License-Identifier: MIT
+// Paints thumbnails and keeps what is dear to make: scaled pictures and fitted captions.
+#include "models/TableViewDelegate.h"
+
+#include <cmath>
+
+#include <QtCore/QCache>
+#include <QtGui/QFontDatabase>
+#include <QtGui/QFontMetrics>
+#include <QtGui/QPaintEngine>
+#include <QtGui/QPainter>
+#include <QtGui/QPixmap>
+#include <QtGui/QStaticText>
+
+#include "models/ThumbnailGeometry.h"
+
+namespace vx
+{
+namespace
+{
+const QColor c_selectedBar(236, 208, 30, 185);
+const QColor c_plainBar(109, 110, 113, 185);
+constexpr int c_pictureCacheKibibytes = 40960;
+constexpr int c_captionCacheEntries = 4096;
+
+struct PictureKey
+{
+    qint64 image;
+    QSize size; // device pixels
+    bool smooth;
+
+    bool operator==(const PictureKey& other) const
+    {
+        return image == other.image && size == other.size && smooth == other.smooth;
+    }
+};
+
+uint qHash(const PictureKey& key, uint seed)
+{
+    return ::qHash(key.image, seed) ^ uint(key.size.width() * 31 + key.size.height()) ^ (key.smooth ? 0x10000u : 0u);
+}
+
+struct CaptionKey
+{
+    QString text;
+    int width;
+    int size;
+
+    bool operator==(const CaptionKey& other) const
+    {
+        return width == other.width && size == other.size && text == other.text;
+    }
+};
+
+uint qHash(const CaptionKey& key, uint seed)
+{
+    return ::qHash(key.text, seed) ^ uint(key.width * 31 + key.size);
+}
+
+/// A text at the size and in the words in which it fits.
+struct Caption
+{
+    QFont font;
+    QString text;
+    QStaticText glyphs; // empty for a text that only a full layout draws rightly
+    int height = 0;
+};
+
+QFont captionFont(int pixelSize)
+{
+    static QFont font = QFontDatabase::systemFont(QFontDatabase::FixedFont);
+    font.setPixelSize(qMax(pixelSize, 1));
+    return font;
+}
+
+/// Whether a static text draws @p text as QPainter::drawText() does.
+bool isOneLine(const QString& text)
+{
+    for (const QChar character : text) {
+        if (character.unicode() < 0x20 || character == QChar::LineSeparator
+            || character == QChar::ParagraphSeparator) {
+            return false;
+        }
+    }
+    return true;
+}
+
+Caption* makeCaption(const CaptionKey& key)
+{
+    auto* caption = new Caption;
+    const int size = thumbnail::fittingSize(key.size, key.width,
+        [&key](int pixels) { return QFontMetrics(captionFont(pixels)).horizontalAdvance(key.text); });
+    caption->font = captionFont(size);
+    const QFontMetrics metrics(caption->font);
+    caption->text = metrics.elidedText(key.text, Qt::ElideLeft, key.width);
+    caption->height = metrics.height();
+    if (isOneLine(caption->text)) {
+        caption->glyphs.setTextFormat(Qt::PlainText);
+        caption->glyphs.setPerformanceHint(QStaticText::AggressiveCaching);
+        caption->glyphs.setText(caption->text);
+        caption->glyphs.prepare(QTransform(), caption->font);
+    }
+    return caption;
+}
+
+bool isWhole(qreal value)
+{
+    return std::abs(value - std::round(value)) < 1e-6;
+}
+}
+
+struct TableViewDelegate::Cache
+{
+    QCache<PictureKey, QPixmap> pictures {c_pictureCacheKibibytes};
+    QCache<CaptionKey, Caption> captions {c_captionCacheEntries};
+};
+
+TableViewDelegate::TableViewDelegate(QObject* parent)
+    : QStyledItemDelegate(parent)
+    , m_cache(new Cache)
+{
+}
+
+TableViewDelegate::~TableViewDelegate() = default;
+
+void TableViewDelegate::setScaleFont(bool scale)
+{
+    m_scaleFont = scale;
+}
+
+void TableViewDelegate::setPictureCacheLimit(int kibibytes)
+{
+    m_cache->pictures.setMaxCost(qMax(kibibytes, 0));
+}
+
+QRect TableViewDelegate::adjustAlignment(const QSize& imageSize, const QRect& rect, int alignment)
+{
+    return thumbnail::align(imageSize, rect, alignment);
+}
+
+QRect TableViewDelegate::fitIntoRectWithAspectRatio(const QRect& rect, const QSize& size, bool expand)
+{
+    return thumbnail::fitWithAspectRatio(rect, size, expand);
+}
+
+void TableViewDelegate::paint(
+    QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const
+{
+    painter->save();
+    QRect rect = option.rect;
+    QImage image;
+    pixmapFromIndex(index, image, nullptr);
+    if (!image.isNull()) {
+        const int alignment = index.data(Qt::TextAlignmentRole).toInt();
+        rect = adjustAlignment(image.size(), rect, alignment);
+        drawPicture(painter, rect.adjusted(10, 10, -1, -1), image);
+    }
+    QRect title = getTitleRect(rect);
+    const bool selected = option.state.testFlag(QStyle::State_Selected);
+    paintCaption(title, title, index, painter, option, selected ? c_selectedBar : c_plainBar, Qt::DisplayRole);
+    painter->restore();
+}
+
+int TableViewDelegate::getFontSize(int height) const
+{
+    return thumbnail::fontSize(height, m_scaleFont);
+}
+
+int TableViewDelegate::getTitleHeight(int height) const
+{
+    return thumbnail::titleHeight(height, m_scaleFont);
+}
+
+QRect TableViewDelegate::getTitleRect(const QRect& rect) const
+{
+    return thumbnail::titleRect(rect, m_scaleFont);
+}
+
+void TableViewDelegate::pixmapFromIndex(const QModelIndex& index, QImage& image, QSize* size) const
+{
+    image = index.data(Qt::DecorationRole).value<QImage>();
+    if (size != nullptr) {
+        *size = index.data(Qt::SizeHintRole).toSize();
+    }
+}
+
+void TableViewDelegate::fitPixmapIntoFrame(QImage&, QRect&, const QSize&, QPainter*, const QModelIndex&) const { }
+
+void TableViewDelegate::paintCaption(QRect& background, QRect& text, const QModelIndex& index, QPainter* painter,
+    const QStyleOptionViewItem& option, const QColor& color, Qt::ItemDataRole role) const
+{
+    const QString words = index.data(role).toString();
+    if (words.isEmpty()) {
+        return;
+    }
+    painter->fillRect(background, color);
+    const int size = getFontSize(text.height());
+    const bool selected = option.state.testFlag(QStyle::State_Selected);
+    painter->setPen(Qt::white);
+    painter->setBrush(
+        option.palette.brush(QPalette::Active, selected ? QPalette::HighlightedText : QPalette::ButtonText));
+    text.adjust(4, 0, -4, 0);
+
+    const CaptionKey key {words, text.width(), size};
+    Caption* caption = m_cache->captions.object(key);
+    if (caption == nullptr) {
+        caption = makeCaption(key);
+        m_cache->captions.insert(key, caption);
+    }
+    painter->setFont(caption->font);
+    if (caption->glyphs.text().isEmpty() || painter->layoutDirection() == Qt::RightToLeft) {
+        painter->drawText(text, Qt::AlignLeft | Qt::AlignVCenter, caption->text);
+        return;
+    }
+    painter->drawStaticText(
+        QPointF(text.left(), text.top() + (text.height() - caption->height) / 2.0), caption->glyphs);
+}
+
+void TableViewDelegate::drawPicture(QPainter* painter, const QRect& rect, const QImage& image) const
+{
+    const QTransform transform = painter->deviceTransform();
+    const QPaintEngine* const engine = painter->paintEngine();
+    const qreal ratio = painter->device()->devicePixelRatioF();
+    const QRectF target = transform.mapRect(QRectF(rect));
+    const QSize size = target.size().toSize();
+    const int cost = int(qMin<qint64>(qint64(size.width()) * size.height() * 4 / 1024 + 1, INT_MAX));
+    // Kept pictures are blitted, so that they have to lie on whole device pixels, unrotated.
+    const bool canKeep = !rect.isEmpty() && engine != nullptr && engine->type() == QPaintEngine::Raster
+        && painter->worldTransform().type() <= QTransform::TxTranslate && transform.type() <= QTransform::TxScale
+        && isWhole(target.x()) && isWhole(target.y()) && isWhole(target.width()) && isWhole(target.height())
+        && cost <= m_cache->pictures.maxCost() / 8;
+    if (!canKeep) {
+        painter->drawImage(rect, image);
+        return;
+    }
+    const bool smooth = painter->testRenderHint(QPainter::SmoothPixmapTransform);
+    const PictureKey key {image.cacheKey(), size, smooth};
+    const QPixmap* kept = m_cache->pictures.object(key);
+    if (kept == nullptr || kept->devicePixelRatioF() != ratio) {
+        auto* picture = new QPixmap(size);
+        if (image.hasAlphaChannel()) {
+            picture->fill(Qt::transparent);
+        }
+        QPainter scaler(picture);
+        scaler.setRenderHint(QPainter::SmoothPixmapTransform, smooth);
+        scaler.drawImage(QRect(QPoint(0, 0), size), image);
+        scaler.end();
+        picture->setDevicePixelRatio(ratio);
+        m_cache->pictures.insert(key, picture, cost);
+        kept = picture;
+    }
+    painter->drawPixmap(rect.topLeft(), *kept);
+}
+}
