@@ -10,7 +10,6 @@
 #include <QtGui/QPaintEngine>
 #include <QtGui/QPainter>
 #include <QtGui/QPixmap>
-#include <QtGui/QStaticText>
 
 #include "models/ThumbnailGeometry.h"
 
@@ -62,8 +61,6 @@ struct Caption
 {
     QFont font;
     QString text;
-    QStaticText glyphs; // empty for a text that only a full layout draws rightly
-    int height = 0;
 };
 
 QFont captionFont(int pixelSize)
@@ -71,18 +68,6 @@ QFont captionFont(int pixelSize)
     static QFont font = QFontDatabase::systemFont(QFontDatabase::FixedFont);
     font.setPixelSize(qMax(pixelSize, 1));
     return font;
-}
-
-/// Whether a static text draws @p text as QPainter::drawText() does.
-bool isOneLine(const QString& text)
-{
-    for (const QChar character : text) {
-        if (character.unicode() < 0x20 || character == QChar::LineSeparator
-            || character == QChar::ParagraphSeparator) {
-            return false;
-        }
-    }
-    return true;
 }
 
 Caption* makeCaption(const CaptionKey& key)
@@ -93,13 +78,6 @@ Caption* makeCaption(const CaptionKey& key)
     caption->font = captionFont(size);
     const QFontMetrics metrics(caption->font);
     caption->text = metrics.elidedText(key.text, Qt::ElideLeft, key.width);
-    caption->height = metrics.height();
-    if (isOneLine(caption->text)) {
-        caption->glyphs.setTextFormat(Qt::PlainText);
-        caption->glyphs.setPerformanceHint(QStaticText::AggressiveCaching);
-        caption->glyphs.setText(caption->text);
-        caption->glyphs.prepare(QTransform(), caption->font);
-    }
     return caption;
 }
 
@@ -208,12 +186,7 @@ void TableViewDelegate::paintCaption(QRect& background, QRect& text, const QMode
         m_cache->captions.insert(key, caption);
     }
     painter->setFont(caption->font);
-    if (caption->glyphs.text().isEmpty() || painter->layoutDirection() == Qt::RightToLeft) {
-        painter->drawText(text, Qt::AlignLeft | Qt::AlignVCenter, caption->text);
-        return;
-    }
-    painter->drawStaticText(
-        QPointF(text.left(), text.top() + (text.height() - caption->height) / 2.0), caption->glyphs);
+    painter->drawText(text, Qt::AlignLeft | Qt::AlignVCenter, caption->text);
 }
 
 void TableViewDelegate::drawPicture(QPainter* painter, const QRect& rect, const QImage& image) const

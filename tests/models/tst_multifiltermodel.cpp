@@ -451,6 +451,7 @@ void TestMultiFilterModel::setSearchFiltersReplacesThemAtOnce()
 {
     m_proxy->setRequiredFilter(2, word("online"), false);
     m_proxy->addSearchFilter({0}, word("roof"));
+    QCOMPARE(names(*m_proxy), list("roof"));
     QSignalSpy inserted(m_proxy.get(), &QAbstractItemModel::rowsInserted);
     m_proxy->setSearchFilters({{{0, 1}, word("gate")}, {{0}, QRegExp()}});
     QCOMPARE(names(*m_proxy), list("gate,yard"));
@@ -470,10 +471,11 @@ void TestMultiFilterModel::rowsModeKeepsTheSelection()
     QCOMPARE(int(m_proxy->refreshMode()), int(vx::MultiFilterModel::RefreshMode::Rows));
     QItemSelectionModel selection(m_proxy.get());
     selection.select(m_proxy->index(3, 0), QItemSelectionModel::Select); // the roof
-    QSignalSpy layout(m_proxy.get(), &QAbstractItemModel::layoutChanged);
+    int layouts = 0;
+    connect(m_proxy.get(), &QAbstractItemModel::layoutChanged, m_proxy.get(), [&layouts] { ++layouts; });
     QSignalSpy removed(m_proxy.get(), &QAbstractItemModel::rowsRemoved);
     m_proxy->setRequiredFilter(2, word("online"), false);
-    QCOMPARE(layout.count(), 0);
+    QCOMPARE(layouts, 0);
     QCOMPARE(removed.count(), 2);
     QCOMPARE(selection.selectedIndexes(), QModelIndexList({m_proxy->index(2, 0)}));
 }
@@ -485,10 +487,11 @@ void TestMultiFilterModel::layoutModeGivesTheSameRowsAndKeepsTheSelection()
     QAbstractItemModelTester tester(m_proxy.get(), QAbstractItemModelTester::FailureReportingMode::QtTest);
     QItemSelectionModel selection(m_proxy.get());
     selection.select(m_proxy->index(3, 0), QItemSelectionModel::Select); // the roof
-    QSignalSpy layout(m_proxy.get(), &QAbstractItemModel::layoutChanged);
+    int layouts = 0;
+    connect(m_proxy.get(), &QAbstractItemModel::layoutChanged, m_proxy.get(), [&layouts] { ++layouts; });
     QSignalSpy removed(m_proxy.get(), &QAbstractItemModel::rowsRemoved);
     m_proxy->setRequiredFilter(2, word("online"), false);
-    QCOMPARE(layout.count(), 1);
+    QCOMPARE(layouts, 1);
     QCOMPARE(removed.count(), 0);
     QCOMPARE(names(*m_proxy), list("gate,yard,roof"));
     QCOMPARE(selection.selectedIndexes(), QModelIndexList({m_proxy->index(2, 0)}));
