@@ -9,6 +9,7 @@
 #include <QAbstractSlider>
 #include <QApplication>
 #include <QEasingCurve>
+#include <QMetaMethod>
 #include <QPropertyAnimation>
 #include <QScrollBar>
 #include <QSize>
@@ -207,10 +208,12 @@ bool MouseAdapter::handleButton(QObject* object, QEvent* event)
 
 bool MouseAdapter::handleMove(QObject* object, QEvent* event)
 {
+    // Without a slot the copy of the event is not worth making.
+    static const QMetaMethod movedSignal = QMetaMethod::fromSignal(&MouseAdapter::moved);
     const QPointer<QObject> watched(object);
     const bool answer = m_filterEvents;
 
-    if (m_mouseTracking) {
+    if (m_mouseTracking && isSignalConnected(movedSignal)) {
         const QPointer<MouseAdapter> self(this);
         Q_EMIT moved(MouseEvent(static_cast<QMouseEvent*>(event), asWidget(object), 0));
         if (!self || !watched)
@@ -301,6 +304,10 @@ void MouseAdapter::notify(QEvent::Type type)
     if (!gesture)
         return;
 
+    const bool pans = type == QEvent::MouseMove && gesture->isPan(dAny);
+    if (type == QEvent::MouseMove && !pans && !gesture->isFinished())
+        return;
+
     const QPointer<MouseAdapter> self(this);
     switch (type) {
     case QEvent::MouseButtonPress:
@@ -310,7 +317,7 @@ void MouseAdapter::notify(QEvent::Type type)
         Q_EMIT released(gesture);
         break;
     case QEvent::MouseMove:
-        if (gesture->isPan(dAny))
+        if (pans)
             Q_EMIT panning(gesture);
         break;
     default:

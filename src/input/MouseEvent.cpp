@@ -66,12 +66,16 @@ MouseEvent::MouseEvent()
 }
 
 MouseEvent::MouseEvent(QMouseEvent* event, QWidget* widget, qint64 millis)
-    : QMouseEvent(orNothing(event).type(), orNothing(event).localPos(), orNothing(event).windowPos(),
-        orNothing(event).screenPos(), orNothing(event).button(), orNothing(event).buttons(),
-        orNothing(event).modifiers())
+    : MouseEvent(event ? *event : static_cast<const QMouseEvent&>(nothing), event, widget, millis)
+{
+}
+
+MouseEvent::MouseEvent(const QMouseEvent& event, const QInputEvent* stamped, QWidget* widget, qint64 millis)
+    : QMouseEvent(event.type(), event.localPos(), event.windowPos(), event.screenPos(), event.button(),
+        event.buttons(), event.modifiers())
     , m_sourceWidget(widget)
     , m_sourceWidgetName(nameOf(widget))
-    , m_timeMillis(MouseEvent::millis(millis, event))
+    , m_timeMillis(MouseEvent::millis(millis, stamped))
 {
 }
 
@@ -167,10 +171,4 @@ qint64 MouseEvent::millis(qint64 millis, const QInputEvent* event)
         return static_cast<qint64>(event->timestamp());
     return QDateTime::currentMSecsSinceEpoch();
 }
-
-const QMouseEvent& MouseEvent::orNothing(const QMouseEvent* event)
-{
-    return event ? *event : nothing;
-}
-
 } // namespace vx

@@ -77,7 +77,7 @@ private:
     friend class MouseGesture;
 
     MouseEvent(QEvent::Type type, QWidget* widget, qint64 millis, const QPoint& cursor);
-    static const QMouseEvent& orNothing(const QMouseEvent* event);
+    MouseEvent(const QMouseEvent& event, const QInputEvent* stamped, QWidget* widget, qint64 millis);
 
     QPointer<QWidget> m_sourceWidget;
     QString m_sourceWidgetName;

@@ -40,27 +40,6 @@ MouseGesture& MouseGesture::operator=(const MouseGesture& other) = default;
 MouseGesture& MouseGesture::operator=(MouseGesture&& other) = default;
 MouseGesture::~MouseGesture() = default;
 
-const MouseEvent& MouseGesture::eventAt(int index) const
-{
-    // The bounds matter for a gesture that was moved from: it has its indexes, but no events.
-    return index >= 0 && index < m_events.size() ? m_events.at(index) : MouseEvent::nothing;
-}
-
-const MouseEvent& MouseGesture::lastEvent() const
-{
-    return eventAt(m_events.size() - 1);
-}
-
-const MouseEvent& MouseGesture::firstPress() const
-{
-    return eventAt(m_firstPress);
-}
-
-const MouseEvent& MouseGesture::firstRelease() const
-{
-    return eventAt(m_firstRelease);
-}
-
 int MouseGesture::clickedIndex() const
 {
     return m_firstRelease >= 0 ? m_firstRelease : m_firstPress;

@@ -121,10 +121,15 @@ protected:
     int indexOf(QEvent::Type type, int n) const;
 
 private:
-    const MouseEvent& eventAt(int index) const;
-    const MouseEvent& lastEvent() const;
-    const MouseEvent& firstPress() const;
-    const MouseEvent& firstRelease() const;
+    // In the class, since they are asked for every move.
+    const MouseEvent& eventAt(int index) const
+    {
+        // The bounds matter for a gesture that was moved from: it has its indexes, but no events.
+        return index >= 0 && index < m_events.size() ? m_events.at(index) : MouseEvent::nothing;
+    }
+    const MouseEvent& lastEvent() const { return eventAt(m_events.size() - 1); }
+    const MouseEvent& firstPress() const { return eventAt(m_firstPress); }
+    const MouseEvent& firstRelease() const { return eventAt(m_firstRelease); }
     int clickedIndex() const;
     void record(const MouseEvent& event);
     bool matches(Qt::MouseButtons buttons) const;
