@@ -160,18 +160,17 @@ void TestGalleryCli::rehearsalLogsTheSignalsOfRealEvents()
 
 void TestGalleryCli::textsFollowTheLanguage()
 {
-    // Two pictures of the still page differ only by their texts.
     QTemporaryDir folder;
     QVector<QImage> pictures;
     for (const char* language : {"en", "de", "fr"}) {
         const QString target = folder.filePath(QString::fromLatin1(language));
-        QCOMPARE(run({QStringLiteral("--shots"), target, QStringLiteral("--page"), QStringLiteral("mouse-gestures"),
+        QCOMPARE(run({QStringLiteral("--shots"), target, QStringLiteral("--page"), QStringLiteral("badges"),
                       QStringLiteral("--theme"), QStringLiteral("light"), QStringLiteral("--lang"),
                       QString::fromLatin1(language)})
                      .code,
                  0);
         // The list of pages, whose texts change and nothing else.
-        pictures.append(QImage(target + QStringLiteral("/mouse-gestures-light.png")).copy(0, 60, 195, 300));
+        pictures.append(QImage(target + QStringLiteral("/badges-light.png")).copy(0, 60, 195, 300));
     }
     QVERIFY(!pictures.at(0).isNull());
     QVERIFY(pictures.at(0) != pictures.at(1));
