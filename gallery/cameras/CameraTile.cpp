@@ -9,7 +9,7 @@ namespace gallery
 {
 namespace
 {
-const int s_margin = 8;
+const int s_inset = 8;
 const QSize s_countSize(22, 22);
 const QSize s_spinnerSize(44, 44);
 }
@@ -106,14 +106,14 @@ void CameraTile::paintEvent(QPaintEvent*)
         m_spinner.drawBadge(painter, Qt::AlignCenter);
     }
     const int line = painter.fontMetrics().height() + 4;
-    drawCaption(painter, QPointF(s_margin, s_margin), m_name);
-    drawCaption(painter, QPointF(s_margin, height() - s_margin - line),
+    drawCaption(painter, QPointF(s_inset, s_inset), m_name);
+    drawCaption(painter, QPointF(s_inset, height() - s_inset - line),
                 m_millis ? QDateTime::fromMSecsSinceEpoch(m_millis).toString(QStringLiteral("yyyy-MM-dd  HH:mm:ss.zzz"))
                          : QString());
 
-    painter.translate(-s_margin, s_margin);
+    painter.translate(-s_inset, s_inset);
     m_count.drawBadge(painter, Qt::AlignRight | Qt::AlignTop);
-    painter.translate(s_margin, -s_margin);
+    painter.translate(s_inset, -s_inset);
 
     if (m_selected) {
         QPen frame(palette().color(QPalette::Highlight), 3);
