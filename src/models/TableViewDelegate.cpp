@@ -15,13 +15,9 @@
 
 namespace vx
 {
-namespace
+// Named, since members of such types are refused where several sources are compiled as one.
+namespace delegatecache
 {
-const QColor c_selectedBar(236, 208, 30, 185);
-const QColor c_plainBar(109, 110, 113, 185);
-constexpr int c_pictureCacheKibibytes = 40960;
-constexpr int c_captionCacheEntries = 4096;
-
 struct PictureKey
 {
     qint64 image;
@@ -62,6 +58,18 @@ struct Caption
     QFont font;
     QString text;
 };
+}
+
+namespace
+{
+using delegatecache::Caption;
+using delegatecache::CaptionKey;
+using delegatecache::PictureKey;
+
+const QColor c_selectedBar(236, 208, 30, 185);
+const QColor c_plainBar(109, 110, 113, 185);
+constexpr int c_pictureCacheKibibytes = 40960;
+constexpr int c_captionCacheEntries = 4096;
 
 QFont captionFont(int pixelSize)
 {

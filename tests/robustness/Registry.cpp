@@ -9,7 +9,8 @@ const std::vector<Entry>& registry()
     static const std::vector<Entry> entries = [] {
         std::vector<Entry> all;
         for (const std::vector<Entry>& room :
-            {platformEntries(), foundationEntries(), indicatorsEntries(), inputEntries(), slidersEntries()}) {
+            {platformEntries(), foundationEntries(), indicatorsEntries(), inputEntries(), slidersEntries(),
+                modelsEntries()}) {
             all.insert(all.end(), room.begin(), room.end());
         }
         return all;

@@ -76,6 +76,7 @@ std::vector<Entry> foundationEntries();
 std::vector<Entry> indicatorsEntries();
 std::vector<Entry> inputEntries();
 std::vector<Entry> slidersEntries();
+std::vector<Entry> modelsEntries();
 
 // --- Words for entries -----------------------------------------------------------------------------------------
 
