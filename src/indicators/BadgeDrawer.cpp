@@ -131,16 +131,14 @@ void BadgeDrawer::setBadgeBusy(bool on)
             }
             m_widget->installEventFilter(this);
         }
-    } else {
-        // Normally a label has stopped the timer already; not if the host was hidden and shown since.
+    } else if (m_label.isEmpty()) {
         m_busyTimer.stop();
-        if (m_label.isEmpty()) {
-            m_pixmap = QPixmap();
-            if (m_widget) {
-                m_widget->removeEventFilter(this);
-            }
+        m_pixmap = QPixmap();
+        if (m_widget) {
+            m_widget->removeEventFilter(this);
         }
     }
+    // With a label nothing else ends: clients rely on a label set while busy to survive the end of busy.
     refreshHost();
 }
 

@@ -25,6 +25,7 @@ private Q_SLOTS:
     void endOfBusyTakesTheMarkAway();
     void labelSurvivesTheEndOfBusy();
     void labelDuringBusyStopsTheAnimationButNotTheFlag();
+    void aMarkThatCameBackOverALabelTurnsOnAfterTheEndOfBusy();
     void unsetDuringBusyStopsTheAnimationButNotTheFlag();
     void labelDuringBusyGivesWayWhenTheHostIsShownAgain();
     void notBusyWhileNotBusyDoesNothing();
@@ -153,6 +154,26 @@ void TestBadgeSpinner::labelDuringBusyStopsTheAnimationButNotTheFlag()
     QVERIFY(drawer.badgeBusy());
     QVERIFY(!isSpinning(drawer));
     QCOMPARE(drawer.badgeLabel(), QStringLiteral("3"));
+}
+
+void TestBadgeSpinner::aMarkThatCameBackOverALabelTurnsOnAfterTheEndOfBusy()
+{
+    Host host;
+    BadgeDrawer drawer(nullptr, &host);
+    host.showWindow();
+    drawer.setBadgeBusy(true);
+    drawer.setBadgeLabel(QStringLiteral("3"), false);
+    QVERIFY(!isSpinning(drawer));
+    host.hide();
+    host.show();
+    QVERIFY(isSpinning(drawer));
+    // The end of busy leaves everything alone while there is a label.
+    drawer.setBadgeBusy(false);
+    QVERIFY(isSpinning(drawer));
+    QVERIFY(drawer.hasBadge());
+    drawer.unsetBadgeLabel();
+    QVERIFY(!isSpinning(drawer));
+    QVERIFY(!drawer.hasBadge());
 }
 
 void TestBadgeSpinner::unsetDuringBusyStopsTheAnimationButNotTheFlag()
