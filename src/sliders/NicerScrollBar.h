@@ -22,7 +22,9 @@ class QTimer;
 /// turns transparent. A faded bar is not hidden: it still takes the mouse. Wheel events over the bar scroll the area.
 ///
 /// The bar is named "HorizontalNicerScrollBar" or "VerticalNicerScrollBar" for style sheets and sets the colour of
-/// its handle through a style sheet of its own, from the first fade on.
+/// its handle through a style sheet of its own, from the first fade on. Qt heeds colours of a handle only if a style
+/// sheet also says something of the bar itself, so an application has a rule such as "QScrollBar { background:
+/// transparent; border: none; }"; without one the bar looks like any other and its fades are not seen.
 ///
 /// It follows the size of its parent, which is usually the area. One bar serves one area for all its life; a second
 /// one serves the other orientation.
