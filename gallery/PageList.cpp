@@ -7,6 +7,7 @@
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
 #include "pages/MouseGesturesPage.h"
+#include "pages/ScrollBarsPage.h"
 
 namespace gallery
 {
@@ -45,6 +46,12 @@ const QVector<PageEntry>& pages()
                            "BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the "
                            "same into any widget."),
          &make<BadgesPage>},
+        {"scroll-bars", QT_TRANSLATE_NOOP("gallery::PageList", "Sliders"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Scroll bars"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows "
+                           "a click on its groove at once."),
+         &make<ScrollBarsPage>},
     };
     return list;
 }

@@ -421,6 +421,73 @@
         <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the picture below it.</source>
         <translation>MouseAdapter macht aus rohen Mausereignissen Klicks, langes Drücken, Schieben und Wischen. Die Fläche lädt zum Ausprobieren ein; das Bild darunter lässt sich ziehen und anstoßen.</translation>
     </message>
+    <message>
+        <source>Sliders</source>
+        <translation>Schieberegler</translation>
+    </message>
+    <message>
+        <source>Scroll bars</source>
+        <translation>Bildlaufleisten</translation>
+    </message>
+    <message>
+        <source>NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows a click on its groove at once.</source>
+        <translation>NicerScrollBar schwebt über dem Inhalt eines Bildlaufbereichs und verblasst; JumpSlider folgt einem Klick auf seine Rille sofort.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ScrollBarsPage</name>
+    <message>
+        <source>Plain bars</source>
+        <translation>Gewöhnliche Leisten</translation>
+    </message>
+    <message>
+        <source>They take room from the content.</source>
+        <translation>Sie nehmen dem Inhalt Platz weg.</translation>
+    </message>
+    <message>
+        <source>Overlay bars</source>
+        <translation>Schwebende Leisten</translation>
+    </message>
+    <message>
+        <source>They float over it, and fade.</source>
+        <translation>Sie schweben darüber und verblassen.</translation>
+    </message>
+    <message>
+        <source>Top and left</source>
+        <translation>Oben und links</translation>
+    </message>
+    <message>
+        <source>The same on the other edges.</source>
+        <translation>Dasselbe an den anderen Rändern.</translation>
+    </message>
+    <message>
+        <source>A click on the groove</source>
+        <translation>Ein Klick auf die Rille</translation>
+    </message>
+    <message>
+        <source>pages</source>
+        <translation>blättert</translation>
+    </message>
+    <message>
+        <source>jumps</source>
+        <translation>springt</translation>
+    </message>
+    <message>
+        <source>Shown as needed</source>
+        <translation>Bei Bedarf zeigen</translation>
+    </message>
+    <message>
+        <source>Always shown</source>
+        <translation>Immer zeigen</translation>
+    </message>
+    <message>
+        <source>Never shown</source>
+        <translation>Nie zeigen</translation>
+    </message>
+    <message>
+        <source>Fade after a while</source>
+        <translation>Nach einer Weile verblassen</translation>
+    </message>
 </context>
 <context>
     <name>gallery::SignalLog</name>

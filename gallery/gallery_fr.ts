@@ -421,6 +421,73 @@
         <source>MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. Try the pad, and drag or flick the picture below it.</source>
         <translation>MouseAdapter transforme les événements bruts de la souris en clics, appuis longs, déplacements et balayages. Essayez la surface, puis glissez ou lancez l’image au-dessous.</translation>
     </message>
+    <message>
+        <source>Sliders</source>
+        <translation>Curseurs</translation>
+    </message>
+    <message>
+        <source>Scroll bars</source>
+        <translation>Barres de défilement</translation>
+    </message>
+    <message>
+        <source>NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows a click on its groove at once.</source>
+        <translation>NicerScrollBar flotte au-dessus du contenu d’une zone de défilement et s’estompe ; JumpSlider suit aussitôt un clic sur sa rainure.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ScrollBarsPage</name>
+    <message>
+        <source>Plain bars</source>
+        <translation>Barres ordinaires</translation>
+    </message>
+    <message>
+        <source>They take room from the content.</source>
+        <translation>Elles prennent de la place au contenu.</translation>
+    </message>
+    <message>
+        <source>Overlay bars</source>
+        <translation>Barres flottantes</translation>
+    </message>
+    <message>
+        <source>They float over it, and fade.</source>
+        <translation>Elles flottent et s’estompent.</translation>
+    </message>
+    <message>
+        <source>Top and left</source>
+        <translation>En haut et à gauche</translation>
+    </message>
+    <message>
+        <source>The same on the other edges.</source>
+        <translation>Les mêmes sur les autres bords.</translation>
+    </message>
+    <message>
+        <source>A click on the groove</source>
+        <translation>Un clic sur la rainure</translation>
+    </message>
+    <message>
+        <source>pages</source>
+        <translation>avance par page</translation>
+    </message>
+    <message>
+        <source>jumps</source>
+        <translation>saute</translation>
+    </message>
+    <message>
+        <source>Shown as needed</source>
+        <translation>Affichées au besoin</translation>
+    </message>
+    <message>
+        <source>Always shown</source>
+        <translation>Toujours affichées</translation>
+    </message>
+    <message>
+        <source>Never shown</source>
+        <translation>Jamais affichées</translation>
+    </message>
+    <message>
+        <source>Fade after a while</source>
+        <translation>S’estompent après un moment</translation>
+    </message>
 </context>
 <context>
     <name>gallery::SignalLog</name>
