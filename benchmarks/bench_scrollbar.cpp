@@ -6,6 +6,7 @@
 #include <benchmark/benchmark.h>
 
 #include <QtCore/QElapsedTimer>
+#include <QtGui/QPaintEvent>
 #include <QtGui/QPainter>
 #include <QtGui/QPixmap>
 #include <QtWidgets/QApplication>
