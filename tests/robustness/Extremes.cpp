@@ -17,6 +17,7 @@
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QWidget>
 
+#include "Saboteur.h"
 #include "Suites.h"
 
 namespace zelkovtest
@@ -48,12 +49,6 @@ struct Stage
     std::unique_ptr<QWidget> host;
     Subject subject;
 };
-
-bool isQtClass(const QMetaObject* meta)
-{
-    const QByteArray name(meta->className());
-    return name.size() > 1 && name.at(0) == 'Q' && name.at(1) >= 'A' && name.at(1) <= 'Z';
-}
 
 QVariantList extremeEnumerators(const QMetaEnum& meta)
 {

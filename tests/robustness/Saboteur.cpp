@@ -6,13 +6,10 @@
 
 namespace zelkovtest
 {
-namespace
-{
 bool isQtClass(const QMetaObject* meta)
 {
     const QByteArray name(meta->className());
     return name.size() > 1 && name.at(0) == 'Q' && name.at(1) >= 'A' && name.at(1) <= 'Z';
-}
 }
 
 Saboteur::Saboteur(QObject* sender, int signal, std::function<void()> deed)

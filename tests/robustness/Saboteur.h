@@ -23,6 +23,9 @@ private:
     std::function<void()> m_deed;
 };
 
+/// Qt's own class, by its name.
+bool isQtClass(const QMetaObject* meta);
+
 /// Names of the signals that the library's own classes declare, Qt's base classes left out.
 QList<QByteArray> declaredSignals(const QObject* object);
 
