@@ -9,6 +9,7 @@
 
 #include <QtCore/QByteArray>
 #include <QtCore/QList>
+#include <QtCore/QMetaEnum>
 #include <QtCore/QObject>
 #include <QtCore/QPointer>
 #include <QtCore/QVariant>
@@ -108,6 +109,16 @@ struct IsFlags<T, std::void_t<typename T::enum_type>> : std::true_type
 {
 };
 
+// Enumerations without a fixed type, as Qt's own, may not hold any number.
+template<class T, class = void>
+struct HoldsAnyNumber : std::false_type
+{
+};
+template<class T>
+struct HoldsAnyNumber<T, std::void_t<decltype(T{std::underlying_type_t<T>{}})>> : std::true_type
+{
+};
+
 template<class T>
 int argumentType()
 {
@@ -122,7 +133,12 @@ template<class T>
 T argument(const QVariant& value)
 {
     if constexpr (std::is_enum_v<T>) {
-        return static_cast<T>(value.toInt());
+        if constexpr (HoldsAnyNumber<T>::value) {
+            return static_cast<T>(value.toInt());
+        } else {
+            const QMetaEnum meta = QMetaEnum::fromType<T>();
+            return static_cast<T>(meta.value(static_cast<int>(value.toUInt() % static_cast<unsigned>(meta.keyCount()))));
+        }
     } else if constexpr (IsFlags<T>::value) {
         return T(QFlag(value.toInt()));
     } else {
