@@ -7,6 +7,10 @@ function(zelkov_target_defaults target)
         QT_NO_KEYWORDS QT_NO_CAST_FROM_ASCII QT_NO_FOREACH QT_DEPRECATED_WARNINGS)
     target_compile_options(${target} PRIVATE -Wall -Wextra -Wshadow -Wconversion
         $<$<BOOL:${ZELKOV_DEVELOPER}>:-Werror>)
+    if(CMAKE_UNITY_BUILD AND CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+        # A batch includes the sources, and GCC then takes their unnamed namespaces for a header's.
+        target_compile_options(${target} PRIVATE -Wno-subobject-linkage)
+    endif()
     if(ZELKOV_SANITIZE)
         target_compile_options(${target} PRIVATE -fno-omit-frame-pointer -fno-sanitize-recover=all
             -fsanitize=address,undefined,float-divide-by-zero,float-cast-overflow)
