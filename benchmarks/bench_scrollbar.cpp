@@ -1,14 +1,13 @@
 // SPDX-License-Identifier: MIT
-// What one step of scrolling costs with the overlay bar, beside the same area with the plain bar. Both go through the
-// same steps in turns, and the figure that counts is their ratio.
+// What one step of scrolling costs with the overlay bar, beside the same area with the plain bar. Both go through
+// the same steps in turns, and the figure that counts is their ratio.
 #include "sliders/NicerScrollBar.h"
 
 #include <benchmark/benchmark.h>
 
 #include <QtCore/QElapsedTimer>
-#include <QtGui/QPaintEvent>
 #include <QtGui/QPainter>
-#include <QtGui/QPixmap>
+#include <QtGui/QPaintEvent>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QScrollArea>
 
@@ -18,11 +17,10 @@
 namespace
 {
 constexpr int Steps = 50;
-const char ApplicationSheet[]
-    = "QScrollBar { background: transparent; border: none; width: 15px; }"
-      "QScrollBar::handle { background: rgb(120,120,120); }"
-      "QScrollBar::add-line, QScrollBar::sub-line { width: 0; height: 0; border: none; }"
-      "QScrollBar::add-page, QScrollBar::sub-page { background: transparent; }";
+const char ApplicationSheet[] = "QScrollBar { background: transparent; border: none; width: 15px; }"
+                                "QScrollBar::handle { background: rgb(120,120,120); }"
+                                "QScrollBar::add-line, QScrollBar::sub-line { width: 0; height: 0; border: none; }"
+                                "QScrollBar::add-page, QScrollBar::sub-page { background: transparent; }";
 
 // Rows of text, as a list of devices has them.
 class Content : public QWidget

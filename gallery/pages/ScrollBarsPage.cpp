@@ -12,8 +12,8 @@
 #include <QtWidgets/QSlider>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/Scene.h"
+#include "../Hand.h"
 #include "sliders/HSlider.h"
 #include "sliders/JumpSlider.h"
 #include "sliders/NicerScrollBar.h"
@@ -22,8 +22,8 @@ namespace gallery
 {
 namespace
 {
-const QStringList s_floodsOfBars = {QStringLiteral("nicerValueChanged"), QStringLiteral("valueChanged"),
-                              QStringLiteral("sliderMoved")};
+const QStringList s_floodsOfBars
+    = {QStringLiteral("nicerValueChanged"), QStringLiteral("valueChanged"), QStringLiteral("sliderMoved")};
 }
 
 ScrollBarsPage::ScrollBarsPage(SignalLog& log, QWidget* parent)
@@ -125,11 +125,12 @@ QWidget* ScrollBarsPage::makeSettings()
     policy->addItem(tr("Never shown"), static_cast<int>(Qt::ScrollBarAlwaysOff));
     auto* fading = new QCheckBox(tr("Fade after a while"));
     fading->setChecked(true);
-    connect(policy, static_cast<void (QComboBox::*)(int)>(&QComboBox::currentIndexChanged), m_down, [this, policy] {
-        const auto chosen = static_cast<Qt::ScrollBarPolicy>(policy->currentData().toInt());
-        m_across->setScrollBarPolicy(chosen);
-        m_down->setScrollBarPolicy(chosen);
-    });
+    connect(
+        policy, static_cast<void (QComboBox::*)(int)>(&QComboBox::currentIndexChanged), m_down, [this, policy] {
+            const auto chosen = static_cast<Qt::ScrollBarPolicy>(policy->currentData().toInt());
+            m_across->setScrollBarPolicy(chosen);
+            m_down->setScrollBarPolicy(chosen);
+        });
     connect(fading, &QCheckBox::toggled, m_down, [this](bool on) {
         m_across->setFadingEnabled(on);
         m_down->setFadingEnabled(on);

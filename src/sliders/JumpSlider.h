@@ -15,8 +15,8 @@ namespace vx
 /// setValue() emits; the drag that follows emits sliderPressed() again. Presses on the handle and of other buttons
 /// are QSlider's.
 ///
-/// The low end is on the left or at the bottom in every layout direction. With invertedAppearance() the jump leads to
-/// maximum() minus the value, which is the expected one only if minimum() is 0: on other ranges it is off by
+/// The low end is on the left or at the bottom in every layout direction. With invertedAppearance() the jump leads
+/// to maximum() minus the value, which is the expected one only if minimum() is 0: on other ranges it is off by
 /// minimum(), and clients rely on that.
 class ZELKOV_WIDGETS_EXPORT JumpSlider : public QSlider
 {

@@ -45,7 +45,8 @@ const QString NicerScrollBar::s_HorizontalNicerScrollBar = QStringLiteral("Horiz
 const QString NicerScrollBar::s_HorizontalNicerScrollBarInvisible
     = QStringLiteral("HorizontalNicerScrollBarInvisible");
 const QString NicerScrollBar::s_VerticalNicerScrollBar = QStringLiteral("VerticalNicerScrollBar");
-const QString NicerScrollBar::s_VerticalNicerScrollBarInvisible = QStringLiteral("VerticalNicerScrollBarInvisible");
+const QString NicerScrollBar::s_VerticalNicerScrollBarInvisible
+    = QStringLiteral("VerticalNicerScrollBarInvisible");
 
 NicerScrollBar::NicerScrollBar(QWidget* parent)
     : QScrollBar(parent)
@@ -272,8 +273,8 @@ void NicerScrollBar::wheelEvent(QWheelEvent* event)
     if (viewport == nullptr || viewport->isAncestorOf(this)) {
         return;
     }
-    // Scroll areas turn away wheel events that come up from children other than the viewport. What the area does not
-    // want, at the end of its range for instance, goes on to what is around it as ever.
+    // Scroll areas turn away wheel events that come up from children other than the viewport. What the area does
+    // not want, at the end of its range for instance, goes on to what is around it as ever.
     QWheelEvent copy = wheelEventFor(viewport, *event);
     copy.ignore();
     QCoreApplication::sendEvent(viewport, &copy);

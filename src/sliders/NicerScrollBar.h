@@ -11,23 +11,26 @@
 class QAbstractScrollArea;
 class QTimer;
 
-/// A slim scroll bar over the content of a QAbstractScrollArea, in place of the area's own bar, which it switches off.
+/// A slim scroll bar over the content of a QAbstractScrollArea, in place of the area's own bar, which it switches
+/// off.
 ///
-/// The area's own bar (the real one) stays the owner of range and value; this one shadows it. It copies range, page
-/// step and value, and sends back what the user drags: while the handle is held, values of the real bar are not
-/// taken over, and only then this bar's values are handed on. Everything goes through queued connections, one turn of
-/// the event loop later. A press on the groove moves this bar by a page and nothing else, since nothing is dragged.
+/// The area's own bar (the real one) stays the owner of range and value; this one shadows it. It copies range,
+/// page step and value, and sends back what the user drags: while the handle is held, values of the real bar are
+/// not taken over, and only then this bar's values are handed on. Everything goes through queued connections, one
+/// turn of the event loop later. A press on the groove moves this bar by a page and nothing else, since nothing is
+/// dragged.
 ///
-/// 1500 ms after the last activity (a value or range of the real bar, a move of the pointer over this bar) the handle
-/// turns transparent. A faded bar is not hidden: it still takes the mouse. Wheel events over the bar scroll the area.
+/// 1500 ms after the last activity (a value or range of the real bar, a move of the pointer over this bar) the
+/// handle turns transparent. A faded bar is not hidden: it still takes the mouse. Wheel events over the bar scroll
+/// the area.
 ///
 /// The bar is named "HorizontalNicerScrollBar" or "VerticalNicerScrollBar" for style sheets and sets the colour of
-/// its handle through a style sheet of its own, from the first fade on. Qt heeds colours of a handle only if a style
-/// sheet also says something of the bar itself, so an application has a rule such as "QScrollBar { background:
-/// transparent; border: none; }"; without one the bar looks like any other and its fades are not seen.
+/// its handle through a style sheet of its own, from the first fade on. Qt heeds colours of a handle only if a
+/// style sheet also says something of the bar itself, so an application has a rule such as "QScrollBar {
+/// background: transparent; border: none; }"; without one the bar looks like any other and its fades are not seen.
 ///
-/// It follows the size of its parent, which is usually the area. One bar serves one area for all its life; a second
-/// one serves the other orientation.
+/// It follows the size of its parent, which is usually the area. One bar serves one area for all its life; a
+/// second one serves the other orientation.
 class ZELKOV_WIDGETS_EXPORT NicerScrollBar : public QScrollBar
 {
     Q_OBJECT
@@ -53,8 +56,9 @@ public:
     /// A plain scroll bar that shadows nothing and never fades.
     explicit NicerScrollBar(QWidget* parent = nullptr);
 
-    /// Takes over the bar of @p scrollArea with this orientation, with what range and value it has. @p parent is the
-    /// widget that the bar lies on, usually the area itself; the bar's place is computed from the size of the area.
+    /// Takes over the bar of @p scrollArea with this orientation, with what range and value it has. @p parent is
+    /// the widget that the bar lies on, usually the area itself; the bar's place is computed from the size of the
+    /// area.
     NicerScrollBar(
         QAbstractScrollArea* scrollArea, Qt::Orientation orientation, EPositions position, QWidget* parent);
     ~NicerScrollBar() override;

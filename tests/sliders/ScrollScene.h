@@ -13,7 +13,8 @@ class ScrollScene
 {
 public:
     explicit ScrollScene(Qt::Orientation orientation = Qt::Vertical,
-        NicerScrollBar::EPositions position = NicerScrollBar::epAutomatic, const QSize& content = QSize(2000, 3000))
+        NicerScrollBar::EPositions position = NicerScrollBar::epAutomatic,
+        const QSize& content = QSize(2000, 3000))
     {
         area.setFrameShape(QFrame::NoFrame);
         area.resize(300, 200);
@@ -36,10 +37,7 @@ public:
     QTimer* timer() const { return bar->findChild<QTimer*>(QString(), Qt::FindDirectChildrenOnly); }
 
     /// What the end of the delay brings, without waiting for it.
-    void fade() const
-    {
-        QMetaObject::invokeMethod(bar, "fadeBar", Qt::DirectConnection);
-    }
+    void fade() const { QMetaObject::invokeMethod(bar, "fadeBar", Qt::DirectConnection); }
 
     bool faded() const { return bar->styleSheet().contains(QLatin1String("transparent")); }
 

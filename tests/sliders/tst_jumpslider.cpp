@@ -198,16 +198,14 @@ void TestJumpSlider::theJumpIsReportedInOrder()
 {
     Slider slider(Qt::Horizontal);
     QStringList events;
-    connect(&slider, &QSlider::sliderPressed, this, [&] {
-        events << QStringLiteral("pressed %1 at %2").arg(slider.isSliderDown()).arg(slider.value());
-    });
-    connect(&slider, &QSlider::valueChanged, this, [&](int value) {
-        events << QStringLiteral("value %1").arg(value);
-    });
+    connect(&slider, &QSlider::sliderPressed, this,
+        [&] { events << QStringLiteral("pressed %1 at %2").arg(slider.isSliderDown()).arg(slider.value()); });
+    connect(&slider, &QSlider::valueChanged, this,
+        [&](int value) { events << QStringLiteral("value %1").arg(value); });
     press(&slider, QPoint(299, 15));
     QCOMPARE(events,
-        (QStringList {QStringLiteral("pressed 0 at 0"), QStringLiteral("value 100"),
-            QStringLiteral("pressed 1 at 100")}));
+        (QStringList {
+            QStringLiteral("pressed 0 at 0"), QStringLiteral("value 100"), QStringLiteral("pressed 1 at 100")}));
 }
 
 void TestJumpSlider::theJumpGoesOnAsADrag()
@@ -229,8 +227,7 @@ void TestJumpSlider::theJumpGoesOnAsADrag()
 void TestJumpSlider::theEventIsAccepted()
 {
     Slider slider(Qt::Horizontal);
-    QMouseEvent event(
-        QEvent::MouseButtonPress, QPoint(200, 15), Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
+    QMouseEvent event(QEvent::MouseButtonPress, QPoint(200, 15), Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
     event.ignore();
     QCoreApplication::sendEvent(&slider, &event);
     QVERIFY(event.isAccepted());

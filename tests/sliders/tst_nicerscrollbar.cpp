@@ -95,8 +95,8 @@ void TestNicerScrollBar::theStyleNamesStand()
 {
     QCOMPARE(NicerScrollBar::s_HorizontalNicerScrollBar, QStringLiteral("HorizontalNicerScrollBar"));
     QCOMPARE(NicerScrollBar::s_VerticalNicerScrollBar, QStringLiteral("VerticalNicerScrollBar"));
-    QCOMPARE(NicerScrollBar::s_HorizontalNicerScrollBarInvisible,
-        QStringLiteral("HorizontalNicerScrollBarInvisible"));
+    QCOMPARE(
+        NicerScrollBar::s_HorizontalNicerScrollBarInvisible, QStringLiteral("HorizontalNicerScrollBarInvisible"));
     QCOMPARE(NicerScrollBar::s_VerticalNicerScrollBarInvisible, QStringLiteral("VerticalNicerScrollBarInvisible"));
 }
 
@@ -106,10 +106,9 @@ void TestNicerScrollBar::aBarTakesOverTheAreasOwn()
     const bool horizontal = orientation == Qt::Horizontal;
     const ScrollScene scene(orientation);
     QCOMPARE(scene.bar->orientation(), orientation);
-    QCOMPARE(scene.bar->objectName(), horizontal ? QStringLiteral("HorizontalNicerScrollBar")
-                                                 : QStringLiteral("VerticalNicerScrollBar"));
-    QCOMPARE(scene.area.horizontalScrollBarPolicy(),
-        horizontal ? Qt::ScrollBarAlwaysOff : Qt::ScrollBarAsNeeded);
+    QCOMPARE(scene.bar->objectName(),
+        horizontal ? QStringLiteral("HorizontalNicerScrollBar") : QStringLiteral("VerticalNicerScrollBar"));
+    QCOMPARE(scene.area.horizontalScrollBarPolicy(), horizontal ? Qt::ScrollBarAlwaysOff : Qt::ScrollBarAsNeeded);
     QCOMPARE(scene.area.verticalScrollBarPolicy(), horizontal ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
     QVERIFY(!scene.real->isVisible());
     QVERIFY(scene.bar->isVisible());
@@ -124,10 +123,9 @@ void TestNicerScrollBar::theBarLiesWhereItsPositionSays_data()
     QTest::addColumn<Qt::Orientation>("orientation");
     QTest::addColumn<NicerScrollBar::EPositions>("position");
     QTest::addColumn<QString>("edge");
-    const auto row = [](const char* name, Qt::Orientation orientation, NicerScrollBar::EPositions position,
-                         const char* edge) {
-        QTest::newRow(name) << orientation << position << QString::fromLatin1(edge);
-    };
+    const auto row
+        = [](const char* name, Qt::Orientation orientation, NicerScrollBar::EPositions position,
+              const char* edge) { QTest::newRow(name) << orientation << position << QString::fromLatin1(edge); };
     row("horizontal automatic", Qt::Horizontal, NicerScrollBar::epAutomatic, "bottom");
     row("horizontal bottom", Qt::Horizontal, NicerScrollBar::epBottom, "bottom");
     row("horizontal top", Qt::Horizontal, NicerScrollBar::epTop, "top");
@@ -525,10 +523,10 @@ void TestNicerScrollBar::showingRaisesTheBar()
 void TestNicerScrollBar::fadedPixelsShowTheContent()
 {
     ScrollScene scene;
-    scene.area.setStyleSheet(QStringLiteral(
-        "QScrollBar:vertical { background: transparent; border: none; width: 15px; margin: 0px; }"
-        "QScrollBar::add-line, QScrollBar::sub-line { height: 0px; }"
-        "QScrollBar::add-page, QScrollBar::sub-page { background: transparent; }"));
+    scene.area.setStyleSheet(
+        QStringLiteral("QScrollBar:vertical { background: transparent; border: none; width: 15px; margin: 0px; }"
+                       "QScrollBar::add-line, QScrollBar::sub-line { height: 0px; }"
+                       "QScrollBar::add-page, QScrollBar::sub-page { background: transparent; }"));
     scene.area.widget()->setStyleSheet(QStringLiteral("background: rgb(200,0,0);"));
     scene.fade();
     const QPoint onHandle(292, 4);

@@ -33,8 +33,8 @@ QRect handleOf(const QScrollBar* bar)
     return bar->style()->subControlRect(QStyle::CC_ScrollBar, &option, QStyle::SC_ScrollBarSlider, bar);
 }
 
-/// As if the window system had sent it, so that it goes on to the parents when it is ignored. Whether the event was
-/// accepted in the end.
+/// As if the window system had sent it, so that it goes on to the parents when it is ignored. Whether the event
+/// was accepted in the end.
 bool wheel(QWidget* widget, const QPoint& position, const QPoint& angle)
 {
     QWheelEvent event(position, widget->mapToGlobal(position), QPoint(), angle, Qt::NoButton, Qt::NoModifier,
@@ -212,12 +212,10 @@ void TestNicerScrollBarMouse::pressAndReleaseAreReportedBeforeTheBaseClassReport
     ScrollScene scene;
     QVERIFY(QTest::qWaitForWindowExposed(&scene.area));
     QStringList events;
-    connect(scene.bar, &QScrollBar::sliderPressed, this, [&] {
-        events << QStringLiteral("pressed %1").arg(scene.bar->isSliderDown());
-    });
-    connect(scene.bar, &QScrollBar::sliderReleased, this, [&] {
-        events << QStringLiteral("released %1").arg(scene.bar->isSliderDown());
-    });
+    connect(scene.bar, &QScrollBar::sliderPressed, this,
+        [&] { events << QStringLiteral("pressed %1").arg(scene.bar->isSliderDown()); });
+    connect(scene.bar, &QScrollBar::sliderReleased, this,
+        [&] { events << QStringLiteral("released %1").arg(scene.bar->isSliderDown()); });
     zelkovtest::Pointer pointer(scene.bar);
     pointer.move(handleOf(scene.bar).center());
     pointer.press();
