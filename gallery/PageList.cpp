@@ -6,6 +6,7 @@
 
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
+#include "pages/FadesPage.h"
 #include "pages/MouseGesturesPage.h"
 #include "pages/ScrollBarsPage.h"
 
@@ -40,6 +41,12 @@ const QVector<PageEntry>& pages()
                            "MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. "
                            "Try the pad, and drag or flick the picture below it."),
          &make<MouseGesturesPage>},
+        {"fades", QT_TRANSLATE_NOOP("gallery::PageList", "Foundation"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Fades and pulses"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "FadableThing fades as a whole, and one fade can take over from the other at any "
+                           "moment. TFadingWidget is a button that pulses to catch the eye."),
+         &make<FadesPage>},
         {"badges", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Badges and spinners"),
          QT_TRANSLATE_NOOP("gallery::PageList",

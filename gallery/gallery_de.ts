@@ -384,6 +384,89 @@
     </message>
 </context>
 <context>
+    <name>gallery::FadesPage</name>
+    <message>
+        <source>Fade a whole widget</source>
+        <translation>Ein ganzes Widget blenden</translation>
+    </message>
+    <message>
+        <source>Recording resumes in a moment</source>
+        <translation>Die Aufzeichnung geht gleich weiter</translation>
+    </message>
+    <message>
+        <source>Opacity %1 %</source>
+        <translation>Deckkraft %1 %</translation>
+    </message>
+    <message>
+        <source>Fade in</source>
+        <translation>Einblenden</translation>
+    </message>
+    <message>
+        <source>Fade out</source>
+        <translation>Ausblenden</translation>
+    </message>
+    <message>
+        <source>Fade what is inside as well</source>
+        <translation>Auch den Inhalt blenden</translation>
+    </message>
+    <message>
+        <source>Hide at the end</source>
+        <translation>Am Ende verbergen</translation>
+    </message>
+    <message>
+        <source>1 s, 0.35 s</source>
+        <translation>1 s, 0,35 s</translation>
+    </message>
+    <message>
+        <source>0.2 s, 0.2 s</source>
+        <translation>0,2 s, 0,2 s</translation>
+    </message>
+    <message>
+        <source>4 s, 4 s</source>
+        <translation>4 s, 4 s</translation>
+    </message>
+    <message>
+        <source>Pulse</source>
+        <translation>Pulsieren</translation>
+    </message>
+    <message>
+        <source>A press on a button ends its pulse.</source>
+        <translation>Ein Druck auf eine Taste beendet ihr Pulsieren.</translation>
+    </message>
+    <message>
+        <source>Fall once</source>
+        <translation>Einmal abklingen</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Anhalten</translation>
+    </message>
+    <message>
+        <source>Overlay, badge, shadow</source>
+        <translation>Auflage, Plakette, Schatten</translation>
+    </message>
+    <message>
+        <source>Drawn on top of the button, with or without a pulse.</source>
+        <translation>Liegt über der Taste, ob sie pulsiert oder nicht.</translation>
+    </message>
+    <message>
+        <source>overlay</source>
+        <translation>Auflage</translation>
+    </message>
+    <message>
+        <source>badge</source>
+        <translation>Plakette</translation>
+    </message>
+    <message>
+        <source>busy</source>
+        <translation>beschäftigt</translation>
+    </message>
+    <message>
+        <source>shadow</source>
+        <translation>Schatten</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -487,6 +570,12 @@
     <message>
         <source>Fade after a while</source>
         <translation>Nach einer Weile verblassen</translation>
+        <source>Foundation</source>
+        <translation>Grundlagen</translation>
+        <source>Fades and pulses</source>
+        <translation>Blenden und Pulsieren</translation>
+        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
+        <translation>FadableThing blendet als Ganzes, und eine Blende kann die andere jederzeit ablösen. TFadingWidget ist eine Taste, die pulsiert, um aufzufallen.</translation>
     </message>
 </context>
 <context>

@@ -384,6 +384,89 @@
     </message>
 </context>
 <context>
+    <name>gallery::FadesPage</name>
+    <message>
+        <source>Fade a whole widget</source>
+        <translation>Fondu d’un widget entier</translation>
+    </message>
+    <message>
+        <source>Recording resumes in a moment</source>
+        <translation>L’enregistrement reprend dans un instant</translation>
+    </message>
+    <message>
+        <source>Opacity %1 %</source>
+        <translation>Opacité %1 %</translation>
+    </message>
+    <message>
+        <source>Fade in</source>
+        <translation>Faire apparaître</translation>
+    </message>
+    <message>
+        <source>Fade out</source>
+        <translation>Faire disparaître</translation>
+    </message>
+    <message>
+        <source>Fade what is inside as well</source>
+        <translation>Fondre aussi le contenu</translation>
+    </message>
+    <message>
+        <source>Hide at the end</source>
+        <translation>Masquer à la fin</translation>
+    </message>
+    <message>
+        <source>1 s, 0.35 s</source>
+        <translation>1 s, 0,35 s</translation>
+    </message>
+    <message>
+        <source>0.2 s, 0.2 s</source>
+        <translation>0,2 s, 0,2 s</translation>
+    </message>
+    <message>
+        <source>4 s, 4 s</source>
+        <translation>4 s, 4 s</translation>
+    </message>
+    <message>
+        <source>Pulse</source>
+        <translation>Pulser</translation>
+    </message>
+    <message>
+        <source>A press on a button ends its pulse.</source>
+        <translation>Un appui sur un bouton arrête sa pulsation.</translation>
+    </message>
+    <message>
+        <source>Fall once</source>
+        <translation>Décroître une fois</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Arrêter</translation>
+    </message>
+    <message>
+        <source>Overlay, badge, shadow</source>
+        <translation>Superposition, pastille, ombre</translation>
+    </message>
+    <message>
+        <source>Drawn on top of the button, with or without a pulse.</source>
+        <translation>Dessinés sur le bouton, avec ou sans pulsation.</translation>
+    </message>
+    <message>
+        <source>overlay</source>
+        <translation>superposition</translation>
+    </message>
+    <message>
+        <source>badge</source>
+        <translation>pastille</translation>
+    </message>
+    <message>
+        <source>busy</source>
+        <translation>occupé</translation>
+    </message>
+    <message>
+        <source>shadow</source>
+        <translation>ombre</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -487,6 +570,12 @@
     <message>
         <source>Fade after a while</source>
         <translation>S’estompent après un moment</translation>
+        <source>Foundation</source>
+        <translation>Fondations</translation>
+        <source>Fades and pulses</source>
+        <translation>Fondus et pulsations</translation>
+        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
+        <translation>FadableThing apparaît et disparaît d’un bloc, et un fondu peut à tout moment prendre le relais de l’autre. TFadingWidget est un bouton qui pulse pour attirer l’œil.</translation>
     </message>
 </context>
 <context>

@@ -13,11 +13,12 @@ class QPaintEvent;
 /// A widget with a fader: it paints its style-sheet look with the opacity that the fader animates.
 ///
 /// Derive from FadableThing<QWidget> and call `fader()->fadeIn()` and `fader()->fadeOut()`. Child widgets do not fade
-/// along unless `fader()->setFadeChildren(true)` was called; the look is then painted by the effect's picture of the
-/// widget, and draw() is not called.
+/// along unless `fader()->setFadeChildren(true)` was called. The widget then paints nothing itself and draw() is not
+/// called: set Qt::WA_StyledBackground to have Qt paint the style sheet's background.
 ///
 /// A new widget has the opacity 0: it is transparent until it has been faded in, or until
-/// `fader()->setOpacity(1)`. Instantiated for QWidget only.
+/// `fader()->setOpacity(1)`. A subclass should have Q_OBJECT: without it a style sheet takes the widget for a plain
+/// QWidget, and Qt paints the background at full strength below. Instantiated for QWidget only.
 template <typename T>
 class FadableThing : public T
 {
