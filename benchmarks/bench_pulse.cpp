@@ -90,18 +90,22 @@ private:
     std::size_t m_frame = 0;
 };
 
-// Both stand in one window: of two windows the lower one is flushed more slowly.
-void place(QWidget& widget, int index, int extent)
+// All stand in one window and are ready before it is shown: of two windows, or of two widgets that come one after
+// the other, one would be repainted more slowly than the other whatever it draws.
+void show(QWidget& window, const std::vector<QWidget*>& widgets, int extent)
 {
     const int edge = extent + 16;
-    widget.setAttribute(Qt::WA_OpaquePaintEvent);
-    widget.setGeometry(index * edge, 0, edge, edge);
-    widget.window()->resize(2 * edge, edge);
-    widget.window()->show();
-    widget.show();
+    window.resize(int(widgets.size()) * edge, edge);
+    for (std::size_t i = 0; i < widgets.size(); ++i) {
+        widgets[i]->setAttribute(Qt::WA_OpaquePaintEvent);
+        widgets[i]->setGeometry(int(i) * edge, 0, edge, edge);
+    }
+    window.show();
     QCoreApplication::processEvents();
     for (int i = 0; i < 2 * CycleLength; ++i) {
-        widget.repaint();
+        for (QWidget* widget : widgets) {
+            widget->repaint();
+        }
     }
 }
 
@@ -127,8 +131,7 @@ void besideReadyImages(benchmark::State& state)
     QWidget window;
     Pulse pulse(&window, extent);
     ReadyImages floor(&window, extent);
-    place(pulse, 0, extent);
-    place(floor, 1, extent);
+    show(window, {&pulse, &floor}, extent);
     if (!pulse.pulses() || pulse.levels() != LevelCount) {
         std::fprintf(stderr, "the pulse has %d levels\n", pulse.levels());
         std::exit(1);
@@ -153,7 +156,7 @@ void firstCycle(benchmark::State& state)
     const int extent = int(state.range(0));
     QWidget window;
     Pulse pulse(&window, extent);
-    place(pulse, 0, extent);
+    show(window, {&pulse}, extent);
     for (auto _ : state) {
         pulse.forgetTints();
         batch(pulse, CycleLength);
