@@ -516,6 +516,18 @@
         <source>NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows a click on its groove at once.</source>
         <translation>NicerScrollBar schwebt über dem Inhalt eines Bildlaufbereichs und verblasst; JumpSlider folgt einem Klick auf seine Rille sofort.</translation>
     </message>
+    <message>
+        <source>Foundation</source>
+        <translation>Grundlagen</translation>
+    </message>
+    <message>
+        <source>Fades and pulses</source>
+        <translation>Blenden und Pulsieren</translation>
+    </message>
+    <message>
+        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
+        <translation>FadableThing blendet als Ganzes, und eine Blende kann die andere jederzeit ablösen. TFadingWidget ist eine Taste, die pulsiert, um aufzufallen.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::ScrollBarsPage</name>
@@ -570,12 +582,6 @@
     <message>
         <source>Fade after a while</source>
         <translation>Nach einer Weile verblassen</translation>
-        <source>Foundation</source>
-        <translation>Grundlagen</translation>
-        <source>Fades and pulses</source>
-        <translation>Blenden und Pulsieren</translation>
-        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
-        <translation>FadableThing blendet als Ganzes, und eine Blende kann die andere jederzeit ablösen. TFadingWidget ist eine Taste, die pulsiert, um aufzufallen.</translation>
     </message>
 </context>
 <context>

@@ -516,6 +516,18 @@
         <source>NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows a click on its groove at once.</source>
         <translation>NicerScrollBar flotte au-dessus du contenu d’une zone de défilement et s’estompe ; JumpSlider suit aussitôt un clic sur sa rainure.</translation>
     </message>
+    <message>
+        <source>Foundation</source>
+        <translation>Fondations</translation>
+    </message>
+    <message>
+        <source>Fades and pulses</source>
+        <translation>Fondus et pulsations</translation>
+    </message>
+    <message>
+        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
+        <translation>FadableThing apparaît et disparaît d’un bloc, et un fondu peut à tout moment prendre le relais de l’autre. TFadingWidget est un bouton qui pulse pour attirer l’œil.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::ScrollBarsPage</name>
@@ -570,12 +582,6 @@
     <message>
         <source>Fade after a while</source>
         <translation>S’estompent après un moment</translation>
-        <source>Foundation</source>
-        <translation>Fondations</translation>
-        <source>Fades and pulses</source>
-        <translation>Fondus et pulsations</translation>
-        <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
-        <translation>FadableThing apparaît et disparaît d’un bloc, et un fondu peut à tout moment prendre le relais de l’autre. TFadingWidget est un bouton qui pulse pour attirer l’œil.</translation>
     </message>
 </context>
 <context>
