@@ -7,6 +7,7 @@
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
 #include "pages/FadesPage.h"
+#include "pages/DeviceBrowserPage.h"
 #include "pages/MouseGesturesPage.h"
 #include "pages/ScrollBarsPage.h"
 
@@ -59,6 +60,12 @@ const QVector<PageEntry>& pages()
                            "NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows "
                            "a click on its groove at once."),
          &make<ScrollBarsPage>},
+        {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "MultiFilterModel searches 10,000 devices while you type; FlexibleTableModel and "
+                           "TableViewDelegate show them as a wall whose columns follow the width."),
+         &make<DeviceBrowserPage>},
     };
     return list;
 }

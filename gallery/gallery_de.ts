@@ -211,6 +211,152 @@
     </message>
 </context>
 <context>
+    <name>gallery::DeviceBrowserPage</name>
+    <message>
+        <source>North gate</source>
+        <translation>Nordtor</translation>
+    </message>
+    <message>
+        <source>Car park</source>
+        <translation>Parkplatz</translation>
+    </message>
+    <message>
+        <source>Loading ramp</source>
+        <translation>Laderampe</translation>
+    </message>
+    <message>
+        <source>Lobby</source>
+        <translation>Eingangshalle</translation>
+    </message>
+    <message>
+        <source>online</source>
+        <translation>verbunden</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>getrennt</translation>
+    </message>
+    <message>
+        <source>Building %1, %2, camera %3</source>
+        <translation>Gebäude %1, %2, Kamera %3</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Name</translation>
+    </message>
+    <message>
+        <source>Place</source>
+        <translation>Ort</translation>
+    </message>
+    <message>
+        <source>Address</source>
+        <translation>Adresse</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>Zustand</translation>
+    </message>
+    <message>
+        <source>Search in name and address</source>
+        <translation>In Name und Adresse suchen</translation>
+    </message>
+    <message>
+        <source>All places</source>
+        <translation>Alle Orte</translation>
+    </message>
+    <message>
+        <source>All states</source>
+        <translation>Alle Zustände</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices, %3 ms</source>
+        <translation>%1 von %2 Geräten, %3 ms</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::FadesPage</name>
+    <message>
+        <source>Fade a whole widget</source>
+        <translation>Ein ganzes Widget blenden</translation>
+    </message>
+    <message>
+        <source>Recording resumes in a moment</source>
+        <translation>Die Aufzeichnung geht gleich weiter</translation>
+    </message>
+    <message>
+        <source>Opacity %1 %</source>
+        <translation>Deckkraft %1 %</translation>
+    </message>
+    <message>
+        <source>Fade in</source>
+        <translation>Einblenden</translation>
+    </message>
+    <message>
+        <source>Fade out</source>
+        <translation>Ausblenden</translation>
+    </message>
+    <message>
+        <source>Fade what is inside as well</source>
+        <translation>Auch den Inhalt blenden</translation>
+    </message>
+    <message>
+        <source>Hide at the end</source>
+        <translation>Am Ende verbergen</translation>
+    </message>
+    <message>
+        <source>1 s, 0.35 s</source>
+        <translation>1 s, 0,35 s</translation>
+    </message>
+    <message>
+        <source>0.2 s, 0.2 s</source>
+        <translation>0,2 s, 0,2 s</translation>
+    </message>
+    <message>
+        <source>4 s, 4 s</source>
+        <translation>4 s, 4 s</translation>
+    </message>
+    <message>
+        <source>Pulse</source>
+        <translation>Pulsieren</translation>
+    </message>
+    <message>
+        <source>A press on a button ends its pulse.</source>
+        <translation>Ein Druck auf eine Taste beendet ihr Pulsieren.</translation>
+    </message>
+    <message>
+        <source>Fall once</source>
+        <translation>Einmal abklingen</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Anhalten</translation>
+    </message>
+    <message>
+        <source>Overlay, badge, shadow</source>
+        <translation>Auflage, Plakette, Schatten</translation>
+    </message>
+    <message>
+        <source>Drawn on top of the button, with or without a pulse.</source>
+        <translation>Liegt über der Taste, ob sie pulsiert oder nicht.</translation>
+    </message>
+    <message>
+        <source>overlay</source>
+        <translation>Auflage</translation>
+    </message>
+    <message>
+        <source>badge</source>
+        <translation>Plakette</translation>
+    </message>
+    <message>
+        <source>busy</source>
+        <translation>beschäftigt</translation>
+    </message>
+    <message>
+        <source>shadow</source>
+        <translation>Schatten</translation>
+    </message>
+</context>
+<context>
     <name>gallery::GalleryWindow</name>
     <message>
         <source>Zelkov Gallery</source>
@@ -384,89 +530,6 @@
     </message>
 </context>
 <context>
-    <name>gallery::FadesPage</name>
-    <message>
-        <source>Fade a whole widget</source>
-        <translation>Ein ganzes Widget blenden</translation>
-    </message>
-    <message>
-        <source>Recording resumes in a moment</source>
-        <translation>Die Aufzeichnung geht gleich weiter</translation>
-    </message>
-    <message>
-        <source>Opacity %1 %</source>
-        <translation>Deckkraft %1 %</translation>
-    </message>
-    <message>
-        <source>Fade in</source>
-        <translation>Einblenden</translation>
-    </message>
-    <message>
-        <source>Fade out</source>
-        <translation>Ausblenden</translation>
-    </message>
-    <message>
-        <source>Fade what is inside as well</source>
-        <translation>Auch den Inhalt blenden</translation>
-    </message>
-    <message>
-        <source>Hide at the end</source>
-        <translation>Am Ende verbergen</translation>
-    </message>
-    <message>
-        <source>1 s, 0.35 s</source>
-        <translation>1 s, 0,35 s</translation>
-    </message>
-    <message>
-        <source>0.2 s, 0.2 s</source>
-        <translation>0,2 s, 0,2 s</translation>
-    </message>
-    <message>
-        <source>4 s, 4 s</source>
-        <translation>4 s, 4 s</translation>
-    </message>
-    <message>
-        <source>Pulse</source>
-        <translation>Pulsieren</translation>
-    </message>
-    <message>
-        <source>A press on a button ends its pulse.</source>
-        <translation>Ein Druck auf eine Taste beendet ihr Pulsieren.</translation>
-    </message>
-    <message>
-        <source>Fall once</source>
-        <translation>Einmal abklingen</translation>
-    </message>
-    <message>
-        <source>Stop</source>
-        <translation>Anhalten</translation>
-    </message>
-    <message>
-        <source>Overlay, badge, shadow</source>
-        <translation>Auflage, Plakette, Schatten</translation>
-    </message>
-    <message>
-        <source>Drawn on top of the button, with or without a pulse.</source>
-        <translation>Liegt über der Taste, ob sie pulsiert oder nicht.</translation>
-    </message>
-    <message>
-        <source>overlay</source>
-        <translation>Auflage</translation>
-    </message>
-    <message>
-        <source>badge</source>
-        <translation>Plakette</translation>
-    </message>
-    <message>
-        <source>busy</source>
-        <translation>beschäftigt</translation>
-    </message>
-    <message>
-        <source>shadow</source>
-        <translation>Schatten</translation>
-    </message>
-</context>
-<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -527,6 +590,18 @@
     <message>
         <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
         <translation>FadableThing blendet als Ganzes, und eine Blende kann die andere jederzeit ablösen. TFadingWidget ist eine Taste, die pulsiert, um aufzufallen.</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modelle</translation>
+    </message>
+    <message>
+        <source>Device browser</source>
+        <translation>Gerätesuche</translation>
+    </message>
+    <message>
+        <source>MultiFilterModel searches 10,000 devices while you type; FlexibleTableModel and TableViewDelegate show them as a wall whose columns follow the width.</source>
+        <translation>MultiFilterModel durchsucht 10.000 Geräte während der Eingabe; FlexibleTableModel und TableViewDelegate zeigen sie als Wand, deren Spalten der Breite folgen.</translation>
     </message>
 </context>
 <context>

@@ -211,6 +211,152 @@
     </message>
 </context>
 <context>
+    <name>gallery::DeviceBrowserPage</name>
+    <message>
+        <source>North gate</source>
+        <translation>Porte nord</translation>
+    </message>
+    <message>
+        <source>Car park</source>
+        <translation>Parking</translation>
+    </message>
+    <message>
+        <source>Loading ramp</source>
+        <translation>Quai de chargement</translation>
+    </message>
+    <message>
+        <source>Lobby</source>
+        <translation>Hall</translation>
+    </message>
+    <message>
+        <source>online</source>
+        <translation>en ligne</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>hors ligne</translation>
+    </message>
+    <message>
+        <source>Building %1, %2, camera %3</source>
+        <translation>Bâtiment %1, %2, caméra %3</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Nom</translation>
+    </message>
+    <message>
+        <source>Place</source>
+        <translation>Lieu</translation>
+    </message>
+    <message>
+        <source>Address</source>
+        <translation>Adresse</translation>
+    </message>
+    <message>
+        <source>State</source>
+        <translation>État</translation>
+    </message>
+    <message>
+        <source>Search in name and address</source>
+        <translation>Rechercher dans le nom et l’adresse</translation>
+    </message>
+    <message>
+        <source>All places</source>
+        <translation>Tous les lieux</translation>
+    </message>
+    <message>
+        <source>All states</source>
+        <translation>Tous les états</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices, %3 ms</source>
+        <translation>%1 appareils sur %2, %3 ms</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::FadesPage</name>
+    <message>
+        <source>Fade a whole widget</source>
+        <translation>Fondu d’un widget entier</translation>
+    </message>
+    <message>
+        <source>Recording resumes in a moment</source>
+        <translation>L’enregistrement reprend dans un instant</translation>
+    </message>
+    <message>
+        <source>Opacity %1 %</source>
+        <translation>Opacité %1 %</translation>
+    </message>
+    <message>
+        <source>Fade in</source>
+        <translation>Faire apparaître</translation>
+    </message>
+    <message>
+        <source>Fade out</source>
+        <translation>Faire disparaître</translation>
+    </message>
+    <message>
+        <source>Fade what is inside as well</source>
+        <translation>Fondre aussi le contenu</translation>
+    </message>
+    <message>
+        <source>Hide at the end</source>
+        <translation>Masquer à la fin</translation>
+    </message>
+    <message>
+        <source>1 s, 0.35 s</source>
+        <translation>1 s, 0,35 s</translation>
+    </message>
+    <message>
+        <source>0.2 s, 0.2 s</source>
+        <translation>0,2 s, 0,2 s</translation>
+    </message>
+    <message>
+        <source>4 s, 4 s</source>
+        <translation>4 s, 4 s</translation>
+    </message>
+    <message>
+        <source>Pulse</source>
+        <translation>Pulser</translation>
+    </message>
+    <message>
+        <source>A press on a button ends its pulse.</source>
+        <translation>Un appui sur un bouton arrête sa pulsation.</translation>
+    </message>
+    <message>
+        <source>Fall once</source>
+        <translation>Décroître une fois</translation>
+    </message>
+    <message>
+        <source>Stop</source>
+        <translation>Arrêter</translation>
+    </message>
+    <message>
+        <source>Overlay, badge, shadow</source>
+        <translation>Superposition, pastille, ombre</translation>
+    </message>
+    <message>
+        <source>Drawn on top of the button, with or without a pulse.</source>
+        <translation>Dessinés sur le bouton, avec ou sans pulsation.</translation>
+    </message>
+    <message>
+        <source>overlay</source>
+        <translation>superposition</translation>
+    </message>
+    <message>
+        <source>badge</source>
+        <translation>pastille</translation>
+    </message>
+    <message>
+        <source>busy</source>
+        <translation>occupé</translation>
+    </message>
+    <message>
+        <source>shadow</source>
+        <translation>ombre</translation>
+    </message>
+</context>
+<context>
     <name>gallery::GalleryWindow</name>
     <message>
         <source>Zelkov Gallery</source>
@@ -384,89 +530,6 @@
     </message>
 </context>
 <context>
-    <name>gallery::FadesPage</name>
-    <message>
-        <source>Fade a whole widget</source>
-        <translation>Fondu d’un widget entier</translation>
-    </message>
-    <message>
-        <source>Recording resumes in a moment</source>
-        <translation>L’enregistrement reprend dans un instant</translation>
-    </message>
-    <message>
-        <source>Opacity %1 %</source>
-        <translation>Opacité %1 %</translation>
-    </message>
-    <message>
-        <source>Fade in</source>
-        <translation>Faire apparaître</translation>
-    </message>
-    <message>
-        <source>Fade out</source>
-        <translation>Faire disparaître</translation>
-    </message>
-    <message>
-        <source>Fade what is inside as well</source>
-        <translation>Fondre aussi le contenu</translation>
-    </message>
-    <message>
-        <source>Hide at the end</source>
-        <translation>Masquer à la fin</translation>
-    </message>
-    <message>
-        <source>1 s, 0.35 s</source>
-        <translation>1 s, 0,35 s</translation>
-    </message>
-    <message>
-        <source>0.2 s, 0.2 s</source>
-        <translation>0,2 s, 0,2 s</translation>
-    </message>
-    <message>
-        <source>4 s, 4 s</source>
-        <translation>4 s, 4 s</translation>
-    </message>
-    <message>
-        <source>Pulse</source>
-        <translation>Pulser</translation>
-    </message>
-    <message>
-        <source>A press on a button ends its pulse.</source>
-        <translation>Un appui sur un bouton arrête sa pulsation.</translation>
-    </message>
-    <message>
-        <source>Fall once</source>
-        <translation>Décroître une fois</translation>
-    </message>
-    <message>
-        <source>Stop</source>
-        <translation>Arrêter</translation>
-    </message>
-    <message>
-        <source>Overlay, badge, shadow</source>
-        <translation>Superposition, pastille, ombre</translation>
-    </message>
-    <message>
-        <source>Drawn on top of the button, with or without a pulse.</source>
-        <translation>Dessinés sur le bouton, avec ou sans pulsation.</translation>
-    </message>
-    <message>
-        <source>overlay</source>
-        <translation>superposition</translation>
-    </message>
-    <message>
-        <source>badge</source>
-        <translation>pastille</translation>
-    </message>
-    <message>
-        <source>busy</source>
-        <translation>occupé</translation>
-    </message>
-    <message>
-        <source>shadow</source>
-        <translation>ombre</translation>
-    </message>
-</context>
-<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -527,6 +590,18 @@
     <message>
         <source>FadableThing fades as a whole, and one fade can take over from the other at any moment. TFadingWidget is a button that pulses to catch the eye.</source>
         <translation>FadableThing apparaît et disparaît d’un bloc, et un fondu peut à tout moment prendre le relais de l’autre. TFadingWidget est un bouton qui pulse pour attirer l’œil.</translation>
+    </message>
+    <message>
+        <source>Models</source>
+        <translation>Modèles</translation>
+    </message>
+    <message>
+        <source>Device browser</source>
+        <translation>Recherche d’appareils</translation>
+    </message>
+    <message>
+        <source>MultiFilterModel searches 10,000 devices while you type; FlexibleTableModel and TableViewDelegate show them as a wall whose columns follow the width.</source>
+        <translation>MultiFilterModel cherche parmi 10 000 appareils pendant la saisie ; FlexibleTableModel et TableViewDelegate les montrent en un mur dont les colonnes suivent la largeur.</translation>
     </message>
 </context>
 <context>

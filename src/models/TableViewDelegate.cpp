@@ -2,6 +2,7 @@
 // Paints thumbnails and keeps what is dear to make: scaled pictures and fitted captions.
 #include "models/TableViewDelegate.h"
 
+#include <climits>
 #include <cmath>
 
 #include <QtCore/QCache>
@@ -38,18 +39,19 @@ uint qHash(const PictureKey& key, uint seed)
 struct CaptionKey
 {
     QString text;
-    int width;
+    QSize extent; // logical pixels
     int size;
+    Qt::LayoutDirection direction;
 
     bool operator==(const CaptionKey& other) const
     {
-        return width == other.width && size == other.size && text == other.text;
+        return extent == other.extent && size == other.size && direction == other.direction && text == other.text;
     }
 };
 
 uint qHash(const CaptionKey& key, uint seed)
 {
-    return ::qHash(key.text, seed) ^ uint(key.width * 31 + key.size);
+    return ::qHash(key.text, seed) ^ uint(key.extent.width() * 31 + key.extent.height() * 7 + key.size);
 }
 
 /// A text at the size and in the words in which it fits.
@@ -57,6 +59,7 @@ struct Caption
 {
     QFont font;
     QString text;
+    QPixmap glyphs; // the text alone, white on nothing
 };
 }
 
@@ -69,7 +72,8 @@ using delegatecache::PictureKey;
 const QColor c_selectedBar(236, 208, 30, 185);
 const QColor c_plainBar(109, 110, 113, 185);
 constexpr int c_pictureCacheKibibytes = 40960;
-constexpr int c_captionCacheEntries = 4096;
+constexpr int c_captionCacheKibibytes = 8192;
+constexpr int c_captionAlignment = Qt::AlignLeft | Qt::AlignVCenter;
 
 QFont captionFont(int pixelSize)
 {
@@ -81,11 +85,11 @@ QFont captionFont(int pixelSize)
 Caption* makeCaption(const CaptionKey& key)
 {
     auto* caption = new Caption;
-    const int size = thumbnail::fittingSize(key.size, key.width,
+    const int size = thumbnail::fittingSize(key.size, key.extent.width(),
         [&key](int pixels) { return QFontMetrics(captionFont(pixels)).horizontalAdvance(key.text); });
     caption->font = captionFont(size);
     const QFontMetrics metrics(caption->font);
-    caption->text = metrics.elidedText(key.text, Qt::ElideLeft, key.width);
+    caption->text = metrics.elidedText(key.text, Qt::ElideLeft, key.extent.width());
     return caption;
 }
 
@@ -93,12 +97,46 @@ bool isWhole(qreal value)
 {
     return std::abs(value - std::round(value)) < 1e-6;
 }
+
+/// The size of @p rect in device pixels, if a kept picture of it can be blitted: it has to lie on whole device pixels
+/// of a raster, unrotated. Empty otherwise.
+QSize blitSize(const QPainter* painter, const QRect& rect)
+{
+    const QPaintEngine* const engine = painter->paintEngine();
+    const QTransform transform = painter->deviceTransform();
+    if (rect.isEmpty() || engine == nullptr || engine->type() != QPaintEngine::Raster
+        || painter->worldTransform().type() > QTransform::TxTranslate || transform.type() > QTransform::TxScale) {
+        return QSize();
+    }
+    const QRectF target = transform.mapRect(QRectF(rect));
+    const bool whole
+        = isWhole(target.x()) && isWhole(target.y()) && isWhole(target.width()) && isWhole(target.height());
+    return whole ? target.size().toSize() : QSize();
+}
+
+int kibibytes(const QSize& size)
+{
+    return int(qMin<qint64>(qint64(size.width()) * size.height() * 4 / 1024 + 1, INT_MAX));
+}
+
+/// Laying out glyphs takes longer than all the rest of a cell, so that the drawn text is kept, too.
+void bakeGlyphs(Caption& caption, const CaptionKey& key, const QSize& size, qreal ratio)
+{
+    caption.glyphs = QPixmap(size);
+    caption.glyphs.setDevicePixelRatio(ratio);
+    caption.glyphs.fill(Qt::transparent);
+    QPainter painter(&caption.glyphs);
+    painter.setLayoutDirection(key.direction);
+    painter.setFont(caption.font);
+    painter.setPen(Qt::white);
+    painter.drawText(QRect(QPoint(0, 0), key.extent), c_captionAlignment, caption.text);
+}
 }
 
 struct TableViewDelegate::Cache
 {
     QCache<PictureKey, QPixmap> pictures {c_pictureCacheKibibytes};
-    QCache<CaptionKey, Caption> captions {c_captionCacheEntries};
+    QCache<CaptionKey, Caption> captions {c_captionCacheKibibytes};
 };
 
 TableViewDelegate::TableViewDelegate(QObject* parent)
@@ -187,30 +225,32 @@ void TableViewDelegate::paintCaption(QRect& background, QRect& text, const QMode
         option.palette.brush(QPalette::Active, selected ? QPalette::HighlightedText : QPalette::ButtonText));
     text.adjust(4, 0, -4, 0);
 
-    const CaptionKey key {words, text.width(), size};
+    const CaptionKey key {words, text.size(), size, painter->layoutDirection()};
     Caption* caption = m_cache->captions.object(key);
+    const QSize pixels = blitSize(painter, text);
+    const int cost = kibibytes(pixels);
     if (caption == nullptr) {
         caption = makeCaption(key);
-        m_cache->captions.insert(key, caption);
+        m_cache->captions.insert(key, caption, qBound(1, cost, c_captionCacheKibibytes / 8));
     }
     painter->setFont(caption->font);
-    painter->drawText(text, Qt::AlignLeft | Qt::AlignVCenter, caption->text);
+    if (pixels.isEmpty() || cost > c_captionCacheKibibytes / 8) {
+        painter->drawText(text, c_captionAlignment, caption->text);
+        return;
+    }
+    const qreal ratio = painter->device()->devicePixelRatioF();
+    if (caption->glyphs.size() != pixels || caption->glyphs.devicePixelRatioF() != ratio) {
+        bakeGlyphs(*caption, key, pixels, ratio);
+    }
+    painter->drawPixmap(text.topLeft(), caption->glyphs);
 }
 
 void TableViewDelegate::drawPicture(QPainter* painter, const QRect& rect, const QImage& image) const
 {
-    const QTransform transform = painter->deviceTransform();
-    const QPaintEngine* const engine = painter->paintEngine();
     const qreal ratio = painter->device()->devicePixelRatioF();
-    const QRectF target = transform.mapRect(QRectF(rect));
-    const QSize size = target.size().toSize();
-    const int cost = int(qMin<qint64>(qint64(size.width()) * size.height() * 4 / 1024 + 1, INT_MAX));
-    // Kept pictures are blitted, so that they have to lie on whole device pixels, unrotated.
-    const bool canKeep = !rect.isEmpty() && engine != nullptr && engine->type() == QPaintEngine::Raster
-        && painter->worldTransform().type() <= QTransform::TxTranslate && transform.type() <= QTransform::TxScale
-        && isWhole(target.x()) && isWhole(target.y()) && isWhole(target.width()) && isWhole(target.height())
-        && cost <= m_cache->pictures.maxCost() / 8;
-    if (!canKeep) {
+    const QSize size = blitSize(painter, rect);
+    const int cost = kibibytes(size);
+    if (size.isEmpty() || cost > m_cache->pictures.maxCost() / 8) {
         painter->drawImage(rect, image);
         return;
     }

@@ -21,7 +21,7 @@ namespace vx
 /// bar, one without text has no bar. A caption that does not fit gets a smaller font, down to 7 pixels, and is then
 /// cut at the left, where the names of devices resemble each other least; it is always white.
 ///
-/// Scaled pictures and fitted captions are kept, so that a model should return the same QImage (with the same
+/// Scaled pictures and drawn captions are kept, so that a model should return the same QImage (with the same
 /// QImage::cacheKey()) until the picture changes. The memory is limited, see setPictureCacheLimit(). Editing and size
 /// hints are those of the base class.
 class ZELKOV_WIDGETS_EXPORT TableViewDelegate : public QStyledItemDelegate

@@ -677,7 +677,8 @@ void TestTableViewDelegate::captionsLookLikePlainText()
         for (int round = 0; round < 2; ++round) {
             const QImage result = painted(delegate, model.index(0, 0), rect);
             const int difference = largestDifference(result, expected);
-            QVERIFY2(difference <= 2, QByteArray::number(width) + " wide: " + QByteArray::number(difference));
+            // Blending a kept text rounds twice.
+            QVERIFY2(difference <= 4, QByteArray::number(width) + " wide: " + QByteArray::number(difference));
         }
     }
 }
