@@ -481,6 +481,8 @@ private Q_SLOTS:
         QTest::newRow("border image") << QStringLiteral("#bell { border-image: url(FILE); }") << 0 << true;
         QTest::newRow("picture of a later rule")
             << QStringLiteral("#bell { color: red; } #horn { image: url(FILE); }") << 0 << true;
+        QTest::newRow("first of two pictures")
+            << QStringLiteral("#bell { image: url(FILE); } #horn { image: url(none.png); }") << 0 << true;
         QTest::newRow("name after the picture")
             << QStringLiteral("#horn { image: url(FILE); } #bell { color: red; }") << 0 << false;
         QTest::newRow("quoted") << QStringLiteral("#bell { image: url(\"FILE\"); }") << 0 << false;
