@@ -67,6 +67,18 @@ void listPages()
 }
 }
 
+namespace
+{
+// Animations that pages stop on their way out delete themselves later; after the loop there is no later.
+struct DeferredDeletions
+{
+    DeferredDeletions() = default;
+    DeferredDeletions(const DeferredDeletions&) = delete;
+    DeferredDeletions& operator=(const DeferredDeletions&) = delete;
+    ~DeferredDeletions() { QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); }
+};
+}
+
 int main(int argc, char* argv[])
 {
     doWithoutDisplay(argc, argv);
@@ -128,6 +140,7 @@ int main(int argc, char* argv[])
     if (parser.isSet(logFile) && !log.openFile(parser.value(logFile))) {
         return fail(QStringLiteral("cannot write '%1'").arg(parser.value(logFile)));
     }
+    const DeferredDeletions deletions;
     gallery::GalleryWindow window(log);
     window.setLanguage(parser.value(language));
     window.showPage(index);

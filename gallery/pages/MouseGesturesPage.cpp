@@ -162,6 +162,7 @@ QWidget* MouseGesturesPage::makeMap()
     m_map->verticalScrollBar()->setValue(110);
 
     auto* mouse = new vx::MouseAdapter(picture, true);
+    m_mapMouse = mouse;
     mouse->setMouseTracking(false);
     watch(mouse, QStringLiteral("map"), s_chatty);
     connect(mouse, &vx::MouseAdapter::panning, m_map, [this, mouse](const vx::MouseGesture::Ptr& gesture) {
@@ -171,6 +172,12 @@ QWidget* MouseGesturesPage::makeMap()
         mouse->scrollPage(m_map, gesture->swipeDirection(), m_map->viewport()->size());
     });
     return m_map;
+}
+
+MouseGesturesPage::~MouseGesturesPage()
+{
+    // A scroll that still runs has no owner but itself.
+    m_mapMouse->stopAnimation();
 }
 
 void MouseGesturesPage::rehearse(Hand& hand)

@@ -17,6 +17,7 @@ class MouseGesturesPage : public Page
 
 public:
     explicit MouseGesturesPage(SignalLog& log, QWidget* parent = nullptr);
+    ~MouseGesturesPage() override;
 
     void rehearse(Hand& hand) override;
 
@@ -27,6 +28,7 @@ private:
 
     GesturePad* m_pad;
     vx::MouseAdapter* m_mouse;
+    vx::MouseAdapter* m_mapMouse = nullptr;
     QScrollArea* m_map = nullptr;
 };
 }
