@@ -27,7 +27,9 @@ function(zelkov_add_library target alias base)
     set_target_properties(${target} PROPERTIES
         EXPORT_NAME ${alias}
         VERSION ${PROJECT_VERSION}
-        SOVERSION ${PROJECT_VERSION_MAJOR})
+        SOVERSION ${PROJECT_VERSION_MAJOR}
+        # The libraries find each other in whatever prefix they stand.
+        INSTALL_RPATH "$ORIGIN")
     target_include_directories(${target} PUBLIC
         $<BUILD_INTERFACE:${base}>
         $<BUILD_INTERFACE:${PROJECT_BINARY_DIR}/generated>

@@ -29,6 +29,9 @@ if(NOT BUILD_SHARED_LIBS)
     set(ZELKOV_PC_CFLAGS
         "-DZELKOV_WIDGETS_STATIC_DEFINE -DZELKOV_UTILS_STATIC_DEFINE -DZELKOV_COREQT_STATIC_DEFINE -DZELKOV_CORE_STATIC_DEFINE")
 endif()
+# Relative to the file itself, so that an installed copy may be moved or installed with another prefix.
+file(RELATIVE_PATH ZELKOV_PC_TO_PREFIX "/${CMAKE_INSTALL_LIBDIR}/pkgconfig" "/")
+string(REGEX REPLACE "/$" "" ZELKOV_PC_TO_PREFIX "${ZELKOV_PC_TO_PREFIX}")
 configure_file(cmake/zelkovwidgets.pc.in ${PROJECT_BINARY_DIR}/zelkovwidgets.pc @ONLY)
 install(FILES ${PROJECT_BINARY_DIR}/zelkovwidgets.pc
     DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig COMPONENT dev)

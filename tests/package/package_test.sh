@@ -19,29 +19,19 @@ prefix_of() {
     echo "$ZELKOV_SCRATCH/$1"
 }
 
-# The folder for PKG_CONFIG_PATH. A copy that was installed somewhere else than it was configured for may name the
-# wrong prefix; then a corrected copy of the file is used.
+# The folder for PKG_CONFIG_PATH. The file has to name the prefix it stands in, wherever it was configured for.
 pkg_config_path() { # pkg_config_path shared | static
-    local prefix folder corrected
+    local prefix folder libdir
     prefix=$(prefix_of "$1")
     folder=$(dirname "$(find "$prefix" -name zelkovwidgets.pc | head -n 1)")
-    case "$(PKG_CONFIG_PATH=$folder pkg-config --variable=libdir zelkovwidgets)" in
-        "$prefix"/*) echo "$folder" ;;
-        *)
-            corrected=$ZELKOV_SCRATCH/pkgconfig-$1
-            mkdir -p "$corrected"
-            sed "s#^prefix=.*#prefix=$prefix#" "$folder/zelkovwidgets.pc" > "$corrected/zelkovwidgets.pc.$$"
-            mv "$corrected/zelkovwidgets.pc.$$" "$corrected/zelkovwidgets.pc"
-            echo "$corrected"
-            ;;
-    esac
+    libdir=$(PKG_CONFIG_PATH=$folder pkg-config --variable=libdir zelkovwidgets)
+    [ "$(realpath -m "$libdir")" = "$(dirname "$(realpath "$folder")")" ] || fail "pkg-config names $libdir"
+    echo "$folder"
 }
 
-run_hello() { # run_hello PROGRAM shared | static
-    local output libraries
-    # A prefix that the loader does not search.
-    libraries=$(dirname "$(find "$(prefix_of "$2")" -name 'libZelkovWidgets.*' | head -n 1)")
-    output=$(LD_LIBRARY_PATH=$libraries timeout 30 "$1" --once 2>&1) || fail "$1 ended with $?: $output"
+run_hello() { # run_hello PROGRAM [FOLDER-FOR-THE-LOADER]
+    local output
+    output=$(LD_LIBRARY_PATH=${2:-} timeout 30 "$1" --once 2>&1) || fail "$1 ended with $?: $output"
     # The offscreen plug-in says this of any window.
     output=$(echo "$output" | grep -v '^This plugin does not support ' || true)
     [ -z "$output" ] || fail "$1 printed: $output"
@@ -69,7 +59,7 @@ find_package_step() { # shared | static
     rm -rf "$binary"
     configure "$ZELKOV_SOURCE/examples/hello" "$binary" "-DCMAKE_PREFIX_PATH=$(prefix_of "$1")"
     "$CMAKE" --build "$binary"
-    run_hello "$binary/hello" "$1"
+    run_hello "$binary/hello"
 }
 
 pkg_config_step() { # shared | static
@@ -81,7 +71,8 @@ pkg_config_step() { # shared | static
     flags=$(PKG_CONFIG_PATH=$path pkg-config --cflags --libs zelkovwidgets Qt5Widgets)
     # shellcheck disable=SC2086
     "$CXX" -std=c++17 -fPIC "$ZELKOV_SOURCE/examples/hello/main.cpp" -o "$binary/hello" $flags
-    run_hello "$binary/hello" "$1"
+    # The program names no folder, so the loader is told.
+    run_hello "$binary/hello" "$(dirname "$(find "$(prefix_of "$1")" -name 'libZelkovWidgets.*' | head -n 1)")"
     [ "$(PKG_CONFIG_PATH=$path pkg-config --modversion zelkovwidgets)" = "$ZELKOV_VERSION" ] \
         || fail "pkg-config tells another version than $ZELKOV_VERSION"
 }
