@@ -7,7 +7,6 @@
 #include <QtCore/QLocale>
 #include <QtCore/QProcess>
 #include <QtCore/QSortFilterProxyModel>
-#include <QtGui/QFontDatabase>
 #include <QtGui/QScreen>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QCheckBox>
@@ -287,7 +286,6 @@ QWidget* GalleryWindow::makeLog()
     table->setShowGrid(false);
     table->setSelectionBehavior(QAbstractItemView::SelectRows);
     table->setWordWrap(false);
-    table->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     table->verticalHeader()->hide();
     table->verticalHeader()->setDefaultSectionSize(s_logRowHeight);
     table->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
