@@ -36,4 +36,5 @@ configure_file(cmake/zelkovwidgets.pc.in ${PROJECT_BINARY_DIR}/zelkovwidgets.pc 
 install(FILES ${PROJECT_BINARY_DIR}/zelkovwidgets.pc
     DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig COMPONENT dev)
 install(FILES src/resources/ZelkovJson_de.ts src/resources/ZelkovJson_fr.ts
+    src/resources/ZelkovWidgets_de.ts src/resources/ZelkovWidgets_fr.ts
     DESTINATION ${CMAKE_INSTALL_DATADIR}/zelkov/translations COMPONENT dev)
