@@ -44,6 +44,7 @@ public:
     void setBalloonTextMap(const QMap<vx::ValueRange, QString>& texts);
     /// The row of each range of values. Rows of the old map that have no parent are deleted.
     void setBalloonItemMap(const QMap<vx::ValueRange, QPointer<vx::PopoverWidget::Item>>& items);
+    QMap<vx::ValueRange, QPointer<vx::PopoverWidget::Item>> balloonItemMap() const { return m_itemMap; }
     /// Whether values may select rows. Default true.
     void setItemMapEnabled(bool enabled);
     /// For the next popover that is made. Default title and close button.

@@ -516,8 +516,8 @@ void Nubsie::setItemMap(const QMap<ValueRange, QPointer<PopoverWidget::Item>>& m
 {
     if (hasController()) {
         const QPointer<PopoverWidget::Controller> controller = getController();
-        if (!controller.isNull() && controller->container() != nullptr) {
-            controller->container()->clear();
+        if (!controller.isNull() && controller->getContainer() != nullptr) {
+            controller->getContainer()->clear();
         }
     }
     setBalloonItemMap(map);
