@@ -62,6 +62,11 @@ void Label::paintEvent(QPaintEvent* event)
     const QSize wanted = size() * picture.devicePixelRatio();
     if (m_scaledPixmap.isNull() || m_scaledFor != wanted || m_scaledFrom != picture.cacheKey()) {
         m_scaledPixmap = picture.scaled(wanted, Qt::KeepAspectRatioByExpanding, Qt::SmoothTransformation);
+        if (picture.devicePixelRatio() != 1.0) {
+            // QStyle cuts what overhangs in the wrong place then.
+            m_scaledPixmap = m_scaledPixmap.copy(QStyle::alignedRect(
+                Qt::LeftToRight, Qt::AlignCenter, wanted, QRect(QPoint(), m_scaledPixmap.size())));
+        }
         m_scaledFor = wanted;
         m_scaledFrom = picture.cacheKey();
     }

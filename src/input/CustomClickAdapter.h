@@ -40,7 +40,8 @@ public:
     CustomClickAdapter(const CustomClickAdapter&) = delete;
     CustomClickAdapter& operator=(const CustomClickAdapter&) = delete;
 
-    /// What the last click was. For slots of clicked() and toggled(); stays until the next press.
+    /// What the present click is. To be asked in slots of clicked() and toggled(): the release that ends a right
+    /// click, for one, is judged by its time again.
     EClickType getClickType() const;
 
     /// Whether a button that is held for the long click span clicks by itself, the mouse still down; on by default.

@@ -75,7 +75,9 @@ const std::vector<Entry>& registry();
 std::vector<Entry> platformEntries();
 std::vector<Entry> foundationEntries();
 std::vector<Entry> indicatorsEntries();
+std::vector<Entry> labelEntries();
 std::vector<Entry> inputEntries();
+std::vector<Entry> clickEntries();
 std::vector<Entry> slidersEntries();
 std::vector<Entry> modelsEntries();
 
