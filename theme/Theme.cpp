@@ -11,6 +11,7 @@
 static void initThemeResource()
 {
     Q_INIT_RESOURCE(theme);
+    Q_INIT_RESOURCE(timeline);
 }
 
 namespace zelkov
@@ -51,10 +52,11 @@ QColor color(Name name, const char* word)
 
 QString styleSheet(Name name)
 {
+    // Without a sheet, too: the library names pictures that only the application has.
+    initThemeResource();
     if (name == Name::None) {
         return {};
     }
-    initThemeResource();
     QFile file(QStringLiteral(":/zelkov/theme/theme.qss"));
     if (!file.open(QIODevice::ReadOnly)) {
         return {};

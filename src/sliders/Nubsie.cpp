@@ -537,9 +537,12 @@ Nubsie::EValuePopoverType Nubsie::getValuePopoverType() const
 void Nubsie::showValuePopover()
 {
     const QPointer<PopoverWidget::Controller> controller = getController();
-    vx::connect(controller, "2itemPerformed(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)", this,
-        "1handlePopoverAction(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)", Qt::UniqueConnection);
-    vx::connect(controller, "2popoverWillDisappear()", this, "2valuePopoverClosing()", Qt::UniqueConnection);
+    if (!controller.isNull()) {
+        vx::connect(controller, "2itemPerformed(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)", this,
+            "1handlePopoverAction(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)",
+            Qt::UniqueConnection);
+        vx::connect(controller, "2popoverWillDisappear()", this, "2valuePopoverClosing()", Qt::UniqueConnection);
+    }
     setItemMapEnabled(true);
     PopoverBalloonWidget::updateBalloon(turnedRound(trueValue()), m_minimum, m_maximum);
 }

@@ -1,0 +1,49 @@
+#!/usr/bin/env python3
+# SPDX-License-Identifier: MIT
+"""Draws the pictures of the time line anew, in pictures/time-line: run it after a change and commit the result."""
+import math
+import os
+import sys
+
+HERE = os.path.dirname(os.path.abspath(__file__))
+sys.path.insert(0, os.path.join(HERE, "..", "src", "resources"))
+sys.dont_write_bytecode = True
+from draw_pictures import RGBA, box, fall, plain, polygon, render, write  # noqa: E402
+
+SIZE = 64
+FLAGS = {"red": ((240, 92, 88), (206, 44, 49)), "green": ((70, 196, 120), (33, 140, 80)),
+         "gray": ((168, 176, 188), (120, 130, 145))}
+
+
+def flag(colours, mirrored):
+    """A pole at the edge of the range and a pennant that points into it."""
+    cloth = polygon((14, 6), (58, 20), (14, 34))
+    layers = [(box(6, 3, 13, 61, 3), fall(*colours, SIZE)), (cloth, fall(*colours, SIZE)),
+              (box(8, 5, 9.5, 59, 0.7), plain(255, 255, 255, 90))]
+    return [(lambda x, y, shape=shape: shape(SIZE - x, y), colour) for shape, colour in layers] if mirrored else layers
+
+
+def glow(size=100):
+    """White that is thickest around a disc of two thirds and fades out to the edge."""
+    rows = []
+    for y in range(size):
+        row = []
+        for x in range(size):
+            r = math.hypot(x + 0.5 - size / 2, y + 0.5 - size / 2) / (size / 2)
+            cover = max(0.0, 1 - r) / 0.4 if r > 0.6 else 0.35 + 0.65 * (r / 0.6) ** 3
+            row.append((255, 255, 255, int(255 * min(1.0, cover) + 0.5)))
+        rows.append(row)
+    return rows
+
+
+def main():
+    folder = os.path.join(HERE, "pictures", "time-line")
+    write(os.path.join(folder, "glow.png"), RGBA, glow())
+    for name, colours in FLAGS.items():
+        for number in (1, 2):
+            write(os.path.join(folder, "btn_flag_%s%d.png" % (name, number)), RGBA,
+                  render(SIZE, SIZE, flag(colours, number == 2)))
+
+
+if __name__ == "__main__":
+    main()
