@@ -331,24 +331,39 @@ protected:
     void updateNubsieLayer(Nubsie* nubsie);
 
 private:
+    // What the place of a handle at rest depends on, looked up once for all of them.
+    struct Frame
+    {
+        QRectF bar; // slider's coordinates
+        QPoint origin;
+        Qt::Orientation orientation;
+
+        QPointF position(const Nubsie* nubsie) const;
+    };
+
     // MultiNubsieSlider.cpp
+    Frame frame() const;
     void updateNubsiePositionsQueued(bool animated);
+    void layOutNowAndLater();
     void stopNubsieAnimations();
-    void placeNubsie(Nubsie* nubsie, bool animated);
+    static void placeNubsie(Nubsie* nubsie, const Frame& place, bool animated);
     Nubsie* firstLiveNubsie() const;
 
     // MultiNubsieSliderInteraction.cpp
     void setCurrentNubsie(Nubsie* nubsie);
     void resetNubsie(Nubsie* nubsie);
-    bool pressNubsie(QMouseEvent* event);
+    Nubsie* nubsieUnder(const QPoint& position) const;
+    void pressNubsie(Nubsie* nubsie, QMouseEvent* event);
     void dragNubsie(QMouseEvent* event);
     void dragNubsieInSteps(const QPointF& pointer, double target);
-    void settleDrag(QMouseEvent* event);
-    bool settleClick(QMouseEvent* event);
+    double fineSpeed(const QPointF& pointer) const;
+    void settleDrag(const QPoint& position);
+    bool settleClick();
     void closeGesture();
-    bool jumpOnTrack(QMouseEvent* event);
-    bool flagHit(const QPointer<QLabel>& flag, const QPoint& position) const;
-    void updateDragged(const QRect& before);
+    void putBackCurrentNubsie();
+    bool jumpOnTrack(const QPointF& position);
+    static bool flagHit(const QLabel* flag, const QPoint& position);
+    bool releaseFlag(const QLabel* flag, bool& pressed, const QPoint& position, bool& clicked);
 
     // MultiNubsieSliderPainting.cpp: where the number labels of the handle in use stand
     QPointF currentValuePos(const Nubsie* nubsie) const;

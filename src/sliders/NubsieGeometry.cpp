@@ -5,11 +5,21 @@
 #include <QtCore/QLineF>
 
 #include <algorithm>
+#include <cmath>
 
 namespace vx
 {
 namespace NubsieGeometry
 {
+namespace
+{
+double onScreen(double coordinate)
+{
+    constexpr double farthest = 16777215.0; // the largest size of a widget
+    return std::isnan(coordinate) ? 0.0 : std::min(farthest, std::max(-farthest, coordinate));
+}
+}
+
 QRectF barRect(const QRect& area, double barExtent, Qt::Orientation orientation)
 {
     if (area.width() == 0 || area.height() == 0) {
@@ -51,6 +61,16 @@ QPointF positionInMotion(const QRectF& bar, const QPointF& origin, const QSize& 
     }
     return QPointF(bar.left() + origin.x() + (draggedSize.width() - size.height()) * 0.5,
         origin.y() + size.height() * 0.5 + (bar.height() - size.height()) * (1.0 - display));
+}
+
+QPoint rounded(const QPointF& point)
+{
+    return QPointF(onScreen(point.x()), onScreen(point.y())).toPoint();
+}
+
+QPoint truncated(const QPointF& point)
+{
+    return QPoint(static_cast<int>(onScreen(point.x())), static_cast<int>(onScreen(point.y())));
 }
 
 bool discContains(const QRectF& rect, const QPointF& point)

@@ -3,6 +3,8 @@
 #include "sliders/NubsieLayout.h"
 
 #include <algorithm>
+#include <cmath>
+#include <limits>
 #include <numeric>
 
 namespace vx
@@ -84,9 +86,14 @@ void centre(Place* row, int count, const Block& block, double length)
 
 std::vector<int> sortedBy(const std::vector<Place>& places, std::vector<int> order)
 {
-    std::sort(order.begin(), order.end(), [&places](int a, int b) {
-        const double left = places[static_cast<std::size_t>(a)].display;
-        const double right = places[static_cast<std::size_t>(b)].display;
+    // What is no number stands at the end, or there would be no order at all.
+    const auto key = [&places](int index) {
+        const double display = places[static_cast<std::size_t>(index)].display;
+        return std::isnan(display) ? std::numeric_limits<double>::infinity() : display;
+    };
+    std::sort(order.begin(), order.end(), [&key](int a, int b) {
+        const double left = key(a);
+        const double right = key(b);
         return left < right || (left == right && a < b);
     });
     return order;

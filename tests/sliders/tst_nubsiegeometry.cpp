@@ -22,6 +22,7 @@ private Q_SLOTS:
     void aHandleAtRestStandsAtItsDisplayValue();
     void aHandleInMotionStandsByItsDraggedSize_data();
     void aHandleInMotionStandsByItsDraggedSize();
+    void pointsBecomeWholePixels();
     void theHitAreaIsTheDiscWithoutItsEdge_data();
     void theHitAreaIsTheDiscWithoutItsEdge();
 };
@@ -110,6 +111,14 @@ void TestNubsieGeometry::aHandleInMotionStandsByItsDraggedSize()
         = orientation == Qt::Horizontal ? QRectF(0, 17.5, 220, 2.5) : QRectF(17.5, 0, 2.5, 220);
     QTEST(positionInMotion(bar, QPointF(100, 200), QSize(20, 16), QSize(31, 40), current, display, orientation),
         "expected");
+}
+
+void TestNubsieGeometry::pointsBecomeWholePixels()
+{
+    QCOMPARE(rounded(QPointF(10.5, -10.4)), QPoint(11, -10));
+    QCOMPARE(truncated(QPointF(10.9, -10.9)), QPoint(10, -10));
+    QCOMPARE(rounded(QPointF(1e300, -1e300)), QPoint(16777215, -16777215));
+    QCOMPARE(truncated(QPointF(qInf(), qQNaN())), QPoint(16777215, 0));
 }
 
 void TestNubsieGeometry::theHitAreaIsTheDiscWithoutItsEdge_data()

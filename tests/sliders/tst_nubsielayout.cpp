@@ -249,6 +249,7 @@ void TestNubsieLayout::handlesAreSortedAndEqualOnesKeepTheirOrder()
     const std::vector<int> order = sortedByDisplay(places({0.5, 0.1, 0.5, 0.9, 0.1}, {0, 0, 0, 0, 0}));
     QCOMPARE(order, (std::vector<int>{1, 4, 0, 2, 3}));
     QVERIFY(sortedByDisplay({}).empty());
+    QCOMPARE(sortedByDisplay(places({qQNaN(), 0.5, qInf(), 0.1}, {0, 0, 0, 0})), (std::vector<int>{3, 1, 0, 2}));
 }
 
 void TestNubsieLayout::aHandleIsPutAmongItsNeighbours_data()
