@@ -6,8 +6,8 @@
 #include "foundation/Export.h"
 #include "foundation/NubsieID.h"
 #include "foundation/ValueRange.h"
-#include "popover/Item.h"
 #include "popover/PopoverBalloonWidget.h"
+#include "popover/PopoverFlags.h"
 
 #include <QtCore/QDateTime>
 #include <QtCore/QMap>
