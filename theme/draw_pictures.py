@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Draws the pictures of the time line anew, in pictures/time-line: run it after a change and commit the result."""
+"""Draws the pictures of time line and switch anew, in pictures/: run it after a change and commit the result."""
 import math
 import os
 import sys
@@ -8,7 +8,7 @@ import sys
 HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(HERE, "..", "src", "resources"))
 sys.dont_write_bytecode = True
-from draw_pictures import RGBA, box, fall, plain, polygon, render, write  # noqa: E402
+from draw_pictures import RGBA, box, circle, fall, plain, polygon, render, write  # noqa: E402
 
 SIZE = 64
 FLAGS = {"red": ((240, 92, 88), (206, 44, 49)), "green": ((70, 196, 120), (33, 140, 80)),
@@ -36,7 +36,22 @@ def glow(size=100):
     return rows
 
 
+def switch(width=36, height=20):
+    """Three frames: checked, unchecked, partially checked."""
+    layers = []
+    for frame, (colours, knob) in enumerate((
+            (((62, 130, 230), (36, 104, 208)), width - height / 2),
+            (((164, 172, 184), (184, 191, 201)), height / 2),
+            (((126, 152, 196), (110, 138, 186)), width / 2))):
+        left = frame * width
+        layers += [(box(left + 0.5, 0.5, left + width - 0.5, height - 0.5, height / 2), fall(*colours, height)),
+                   (circle(left + knob, height / 2 + 0.6, height / 2 - 2), plain(0, 0, 0, 60)),
+                   (circle(left + knob, height / 2, height / 2 - 2.6), plain(255, 255, 255))]
+    return render(3 * width, height, layers)
+
+
 def main():
+    write(os.path.join(HERE, "pictures", "switch", "btn_schalter.png"), RGBA, switch())
     folder = os.path.join(HERE, "pictures", "time-line")
     write(os.path.join(folder, "glow.png"), RGBA, glow())
     for name, colours in FLAGS.items():

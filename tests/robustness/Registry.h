@@ -80,6 +80,7 @@ std::vector<Entry> inputEntries();
 std::vector<Entry> clickEntries();
 std::vector<Entry> slidersEntries();
 std::vector<Entry> modelsEntries();
+std::vector<Entry> switchEntries();
 
 // --- Words for entries -----------------------------------------------------------------------------------------
 
