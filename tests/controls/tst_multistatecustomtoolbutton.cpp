@@ -58,6 +58,7 @@ private Q_SLOTS:
     {
         OpenCustom button({0, 1}, QStringLiteral("light"), nullptr);
         button.setStyleSheet(QStringLiteral("QToolButton { color: red }"));
+        button.ensurePolished();
         button.styleChanges = 0;
         button.setState(0);
         const int once = button.styleChanges;
