@@ -212,14 +212,11 @@ protected:
 private:
     template<class Visitor>
     bool walk(bool intoNoForward, const Visitor& visitor) const;
-    template<class Visitor>
-    bool walkValues(const QVariant& value, const Visitor& visitor) const;
-    template<class Visitor>
-    void walkSliders(const Visitor& visitor) const;
     template<class Change>
     void changeItem(Item* item, bool emitSignal, const Change& change);
     template<class Change>
-    void changeItems(const QList<Item*>& items, bool emitSignal, const Change& change);
+    void changeItems(int id, bool emitSignal, const Change& change);
+    bool dropPart(QPointer<Container>& part, bool deleteItems);
     void dropItems(bool deleteItems);
 };
 

@@ -131,7 +131,7 @@ public:
     /// The format under which the user data travel in a drag. Default "text/plain".
     void setDragMimeType(const QString& type);
     /// Further formats of a drag; they win over those that the item sets by itself.
-    void setDragMimeData(const QMap<QString, QByteArray>& data);
+    void setDragMimeData(const QMap<QString, QByteArray>& formats);
 
     /// Only administrators may perform the item. A security manager has to be set before it is first clicked.
     void setAdminOnly(bool adminOnly);

@@ -79,6 +79,7 @@ std::vector<Entry> labelEntries();
 std::vector<Entry> inputEntries();
 std::vector<Entry> clickEntries();
 std::vector<Entry> slidersEntries();
+std::vector<Entry> popoverItemEntries();
 std::vector<Entry> modelsEntries();
 std::vector<Entry> switchEntries();
 
