@@ -48,14 +48,18 @@ Container::Container(QWidget* parent, const QString& objectName, Qt::Orientation
 
 Container::~Container()
 {
-    for (const QPointer<Container>& part : {m_header, m_footer}) {
+    // What is about to die is forgotten first: it still looks alive to those who hear of its destruction.
+    for (QPointer<Container>* member : {&m_header, &m_footer}) {
+        QPointer<Container> part;
+        part.swap(*member);
         if (part && !part->parent()) {
             delete part.data();
         }
     }
     // A header container has items outside its layout.
-    const QList<QPointer<Item>> items = m_items;
-    for (const QPointer<Item>& item : items) {
+    QList<QPointer<Item>> items;
+    items.swap(m_items);
+    for (const QPointer<Item>& item : qAsConst(items)) {
         if (item && !item->parent()) {
             delete item.data();
         }
@@ -168,13 +172,14 @@ void Container::resetLayout(bool deleteItems, bool withHeaderAndFooter)
 bool Container::dropPart(QPointer<Container>& part, bool deleteItems)
 {
     const QPointer<Container> self(this);
-    const QPointer<Container> dropped = part;
-    if (dropped) {
-        dropped->resetLayout(deleteItems, false);
+    if (part) {
+        part->resetLayout(deleteItems, false);
+    }
+    if (self) {
+        // Forgotten first: it still looks alive to those who hear of its destruction.
+        QPointer<Container> dropped;
+        dropped.swap(part);
         delete dropped.data();
-        if (self) {
-            part.clear();
-        }
     }
     return !self.isNull();
 }

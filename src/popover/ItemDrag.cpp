@@ -2,6 +2,8 @@
 // The drag of a popover's row.
 #include "popover/Item.h"
 
+#include <QtCore/QCoreApplication>
+#include <QtCore/QEvent>
 #include <QtCore/QMimeData>
 #include <QtGui/QDrag>
 
@@ -13,6 +15,26 @@ namespace
 {
 /// Relative to the size of what is dragged.
 constexpr double c_HotSpot = 0.5;
+
+/// Ends a drag whose item has died. The end has to wait for the event loop, since the item may well die in an answer
+/// to the drag; until then nobody is offered an item that no longer exists.
+class DragEnd : public QObject
+{
+public:
+    explicit DragEnd(QDrag* drag)
+        : QObject(drag)
+    {
+        QCoreApplication::instance()->installEventFilter(this);
+        QMetaObject::invokeMethod(
+            drag, [] { QDrag::cancel(); }, Qt::QueuedConnection);
+    }
+
+    bool eventFilter(QObject* /*watched*/, QEvent* event) override
+    {
+        return event->type() == QEvent::DragEnter || event->type() == QEvent::DragMove
+            || event->type() == QEvent::Drop;
+    }
+};
 }
 
 void Item::startDrag()
@@ -47,8 +69,7 @@ void Item::startDrag()
         delete drag.data();
         return;
     }
-    // Nobody may drop what no longer exists.
-    connect(this, &QObject::destroyed, drag.data(), [] { QDrag::cancel(); });
+    connect(this, &QObject::destroyed, drag.data(), [drag] { new DragEnd(drag); });
     drag->exec(Qt::MoveAction);
 }
 

@@ -201,8 +201,8 @@ private Q_SLOTS:
         QCOMPARE(recorder.names(), expected);
         const QVariantList arguments = recorder.entries().last().arguments;
         QCOMPARE(arguments.at(0).toInt(), 8);
-        QCOMPARE(arguments.at(1), QVariant(QVariant(42)));
-        QCOMPARE(arguments.at(2), QVariant(QVariant(text("data"))));
+        QCOMPARE(arguments.at(1).value<QVariant>(), QVariant(42));
+        QCOMPARE(arguments.at(2).value<QVariant>(), QVariant(text("data")));
         QCOMPARE(int(arguments.at(3).value<pw::EItemPerformedFlags>()), int(pw::eipControl));
         recorder.clear();
         own->perform();
