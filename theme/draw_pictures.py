@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Draws the pictures of time line and switch anew, in pictures/: run it after a change and commit the result."""
+"""Draws the pictures of popovers, time line and switch anew, in pictures/: run it after a change, commit the result."""
 import math
 import os
 import sys
@@ -8,7 +8,7 @@ import sys
 HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(HERE, "..", "src", "resources"))
 sys.dont_write_bytecode = True
-from draw_pictures import RGBA, box, circle, fall, plain, polygon, render, write  # noqa: E402
+from draw_pictures import RGBA, box, circle, fall, line, plain, polygon, render, write  # noqa: E402
 
 SIZE = 64
 FLAGS = {"red": ((240, 92, 88), (206, 44, 49)), "green": ((70, 196, 120), (33, 140, 80)),
@@ -50,7 +50,34 @@ def switch(width=36, height=20):
     return render(3 * width, height, layers)
 
 
+def union(*shapes):
+    return lambda x, y: min(shape(x, y) for shape in shapes)
+
+
+def cross(n):
+    a, b = 0.24 * n, 0.76 * n
+    return union(line(a, a, b, b, 0.1 * n), line(b, a, a, b, 0.1 * n))
+
+
+def question(n):
+    """Three quarters of a circle, a stem and a dot."""
+    turns = [math.radians(180 + 15 * i) for i in range(16)]
+    bow = [((0.5 + 0.2 * math.cos(t)) * n, (0.34 + 0.2 * math.sin(t)) * n) for t in turns]
+    bow += [(0.5 * n, 0.56 * n), (0.5 * n, 0.64 * n)]
+    lines = [line(*a, *b, 0.1 * n) for a, b in zip(bow, bow[1:])]
+    return union(*lines, circle(0.5 * n, 0.83 * n, 0.07 * n))
+
+
+def popovers():
+    for theme, colour in (("light", (93, 106, 126)), ("dark", (152, 165, 185))):
+        for name, shape in (("close", cross), ("help", question)):
+            for suffix, size in (("", 16), ("@2x", 32)):
+                write(os.path.join(HERE, "pictures", theme, name + suffix + ".png"), RGBA,
+                      render(size, size, [(shape(size), plain(*colour))]))
+
+
 def main():
+    popovers()
     write(os.path.join(HERE, "pictures", "switch", "btn_schalter.png"), RGBA, switch())
     folder = os.path.join(HERE, "pictures", "time-line")
     write(os.path.join(folder, "glow.png"), RGBA, glow())

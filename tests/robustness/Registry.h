@@ -78,6 +78,7 @@ std::vector<Entry> indicatorsEntries();
 std::vector<Entry> labelEntries();
 std::vector<Entry> inputEntries();
 std::vector<Entry> clickEntries();
+std::vector<Entry> balloonEntries();
 std::vector<Entry> slidersEntries();
 std::vector<Entry> popoverItemEntries();
 std::vector<Entry> modelsEntries();
