@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What one step of scrolling costs with the overlay bar, beside the same area with the plain bar. Both go through
-// the same steps in turns, and the figure that counts is their ratio.
+// What one step of scrolling costs with the overlay bar, beside the same area with the plain bar and beside one with
+// the least that an overlay can be. All go through the same steps in turns, and the figures that count are the ratios.
 #include "sliders/NicerScrollBar.h"
 
 #include <benchmark/benchmark.h>
@@ -40,17 +40,53 @@ protected:
     }
 };
 
+// As little as an overlay can be: a strip of the same size that draws its handle. What lies under an overlay has to
+// be repainted with it in every step, which a bar beside the content does not ask for.
+class Strip : public QWidget
+{
+public:
+    explicit Strip(QAbstractScrollArea* area)
+        : QWidget(area)
+        , m_bar(area->verticalScrollBar())
+    {
+        area->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        setGeometry(area->width() - 15, 0, 15, area->height());
+        connect(m_bar, &QScrollBar::valueChanged, this, [this] { update(); });
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QPainter painter(this);
+        const double all = m_bar->maximum() + m_bar->pageStep();
+        painter.fillRect(QRectF(0, height() * m_bar->value() / all, width(), height() * m_bar->pageStep() / all),
+            QColor(120, 120, 120));
+    }
+
+private:
+    QScrollBar* m_bar;
+};
+
+enum class Bar
+{
+    Plain,
+    Overlay,
+    Strip
+};
+
 class Area
 {
 public:
-    Area(bool overlay, bool styled)
+    Area(Bar bar, bool styled)
     {
         if (styled) {
             m_area.setStyleSheet(QString::fromLatin1(ApplicationSheet));
         }
         m_area.setWidget(new Content);
         m_area.resize(400, 600);
-        if (overlay) {
+        if (bar == Bar::Strip) {
+            new Strip(&m_area);
+        } else if (bar == Bar::Overlay) {
             new NicerScrollBar(&m_area, Qt::Vertical, NicerScrollBar::epAutomatic, &m_area);
         }
         m_area.show();
@@ -84,18 +120,23 @@ double median(std::vector<double> values)
 void besideThePlainBar(benchmark::State& state)
 {
     const bool styled = state.range(0) != 0;
-    Area overlay(true, styled);
-    Area plain(false, styled);
+    Area overlay(Bar::Overlay, styled);
+    Area plain(Bar::Plain, styled);
+    Area strip(Bar::Strip, styled);
     std::vector<double> overlayTimes;
     std::vector<double> plainTimes;
+    std::vector<double> stripTimes;
     for (auto _ : state) {
         plainTimes.push_back(plain.batch());
+        stripTimes.push_back(strip.batch());
         overlayTimes.push_back(overlay.batch());
         state.SetIterationTime(overlayTimes.back());
     }
     state.counters["overlay_us"] = median(overlayTimes) * 1e6;
     state.counters["plain_us"] = median(plainTimes) * 1e6;
+    state.counters["strip_us"] = median(stripTimes) * 1e6;
     state.counters["ratio"] = median(overlayTimes) / median(plainTimes);
+    state.counters["ratio_to_strip"] = median(overlayTimes) / median(stripTimes);
 }
 }
 

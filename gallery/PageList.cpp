@@ -7,7 +7,9 @@
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
 #include "pages/FadesPage.h"
+#include "pages/ClickVariantsPage.h"
 #include "pages/DeviceBrowserPage.h"
+#include "pages/LabelsPage.h"
 #include "pages/MouseGesturesPage.h"
 #include "pages/ScrollBarsPage.h"
 
@@ -42,6 +44,12 @@ const QVector<PageEntry>& pages()
                            "MouseAdapter turns raw mouse events into clicks, long presses, pans and swipes. "
                            "Try the pad, and drag or flick the picture below it."),
          &make<MouseGesturesPage>},
+        {"click-variants", QT_TRANSLATE_NOOP("gallery::PageList", "Input"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Click variants"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "TCustomClickWidget tells short, long and context clicks apart and asks for rights; "
+                           "CustomContextClickToolButton adds an arrow."),
+         &make<ClickVariantsPage>},
         {"fades", QT_TRANSLATE_NOOP("gallery::PageList", "Foundation"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Fades and pulses"),
          QT_TRANSLATE_NOOP("gallery::PageList",
@@ -54,6 +62,12 @@ const QVector<PageEntry>& pages()
                            "BadgeWidget shows a short text in a pill or a busy mark; BadgeDrawer paints the "
                            "same into any widget."),
          &make<BadgesPage>},
+        {"labels", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Labels"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "ElidedLabel and ElidedButton shorten their text to the room they have; Label covers "
+                           "itself with a picture that keeps its proportions."),
+         &make<LabelsPage>},
         {"scroll-bars", QT_TRANSLATE_NOOP("gallery::PageList", "Sliders"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Scroll bars"),
          QT_TRANSLATE_NOOP("gallery::PageList",

@@ -211,6 +211,141 @@
     </message>
 </context>
 <context>
+    <name>gallery::ClickVariantsPage</name>
+    <message>
+        <source>The last click</source>
+        <translation>Der letzte Klick</translation>
+    </message>
+    <message>
+        <source>None yet</source>
+        <translation>Noch keiner</translation>
+    </message>
+    <message>
+        <source>Click, hold or right click one of the buttons.</source>
+        <translation>Klicken, halten oder rechtsklicken Sie auf einen der Knöpfe.</translation>
+    </message>
+    <message>
+        <source>Long click</source>
+        <translation>Langer Klick</translation>
+    </message>
+    <message>
+        <source>The button clicked by itself, the mouse still down.</source>
+        <translation>Der Knopf hat von selbst geklickt, die Maustaste noch gedrückt.</translation>
+    </message>
+    <message>
+        <source>The button clicked on the release.</source>
+        <translation>Der Knopf hat beim Loslassen geklickt.</translation>
+    </message>
+    <message>
+        <source>Context click</source>
+        <translation>Kontextklick</translation>
+    </message>
+    <message>
+        <source>A right click is a click of its own kind and opens no menu.</source>
+        <translation>Ein Rechtsklick ist ein Klick eigener Art und öffnet kein Menü.</translation>
+    </message>
+    <message>
+        <source>Click on the arrow</source>
+        <translation>Klick auf den Pfeil</translation>
+    </message>
+    <message>
+        <source>The slot opens what it wants.</source>
+        <translation>Der Slot öffnet, was er will.</translation>
+    </message>
+    <message>
+        <source>Normal click</source>
+        <translation>Normaler Klick</translation>
+    </message>
+    <message>
+        <source>Hold the button longer, or use the other mouse button.</source>
+        <translation>Halten Sie den Knopf länger, oder nehmen Sie die andere Maustaste.</translation>
+    </message>
+    <message>
+        <source>Kinds of clicks</source>
+        <translation>Arten von Klicks</translation>
+    </message>
+    <message>
+        <source>Hold</source>
+        <translation>Halten</translation>
+    </message>
+    <message>
+        <source>Clicks by itself after 750 ms.</source>
+        <translation>Klickt nach 750 ms von selbst.</translation>
+    </message>
+    <message>
+        <source>Hold and release</source>
+        <translation>Halten und loslassen</translation>
+    </message>
+    <message>
+        <source>Without automatic clicks.</source>
+        <translation>Ohne automatische Klicks.</translation>
+    </message>
+    <message>
+        <source>Checkable</source>
+        <translation>Umschaltbar</translation>
+    </message>
+    <message>
+        <source>Held, it reports its state and keeps it.</source>
+        <translation>Gehalten meldet er seinen Zustand und behält ihn.</translation>
+    </message>
+    <message>
+        <source>Split</source>
+        <translation>Geteilt</translation>
+    </message>
+    <message>
+        <source>The arrow is a click of its own.</source>
+        <translation>Der Pfeil ist ein eigener Klick.</translation>
+    </message>
+    <message>
+        <source>Rights</source>
+        <translation>Rechte</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Export</translation>
+    </message>
+    <message>
+        <source>Needs the right to export.</source>
+        <translation>Braucht das Recht zu exportieren.</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Einstellungen</translation>
+    </message>
+    <message>
+        <source>For administrators.</source>
+        <translation>Für Administratoren.</translation>
+    </message>
+    <message>
+        <source>The user may export</source>
+        <translation>Der Benutzer darf exportieren</translation>
+    </message>
+    <message>
+        <source>The user is an administrator</source>
+        <translation>Der Benutzer ist Administrator</translation>
+    </message>
+    <message>
+        <source>A widget to click</source>
+        <translation>Ein Widget zum Klicken</translation>
+    </message>
+    <message>
+        <source>Click me with any button</source>
+        <translation>Mit jeder Maustaste klickbar</translation>
+    </message>
+    <message>
+        <source>Click on a widget</source>
+        <translation>Klick auf ein Widget</translation>
+    </message>
+    <message>
+        <source>It has the signals of a button and is none.</source>
+        <translation>Es hat die Signale eines Knopfes und ist keiner.</translation>
+    </message>
+    <message>
+        <source>pressed, clicked and released, with every mouse button.</source>
+        <translation>pressed, clicked und released, mit jeder Maustaste.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::DeviceBrowserPage</name>
     <message>
         <source>North gate</source>
@@ -415,6 +550,61 @@
     </message>
 </context>
 <context>
+    <name>gallery::LabelsPage</name>
+    <message>
+        <source>Texts</source>
+        <translation>Texte</translation>
+    </message>
+    <message>
+        <source>Drag the bar between the two sides.</source>
+        <translation>Ziehen Sie den Balken zwischen den beiden Seiten.</translation>
+    </message>
+    <message>
+        <source>The camera in the main entrance of building 4 does not answer any more</source>
+        <translation>Die Kamera am Haupteingang von Gebäude 4 antwortet nicht mehr</translation>
+    </message>
+    <message>
+        <source>Cut at the end</source>
+        <translation>Am Ende gekürzt</translation>
+    </message>
+    <message>
+        <source>In the middle</source>
+        <translation>In der Mitte</translation>
+    </message>
+    <message>
+        <source>At the start</source>
+        <translation>Am Anfang</translation>
+    </message>
+    <message>
+        <source>Word wrap</source>
+        <translation>Zeilenumbruch</translation>
+    </message>
+    <message>
+        <source>Connect the camera in the main entrance of building 4</source>
+        <translation>Die Kamera am Haupteingang von Gebäude 4 verbinden</translation>
+    </message>
+    <message>
+        <source>Button</source>
+        <translation>Knopf</translation>
+    </message>
+    <message>
+        <source>The text itself stays whole, in tool tips and for the program: %1</source>
+        <translation>Der Text selbst bleibt ganz, für das Programm und für Tipps: %1</translation>
+    </message>
+    <message>
+        <source>Pictures</source>
+        <translation>Bilder</translation>
+    </message>
+    <message>
+        <source>Keep the proportions</source>
+        <translation>Proportionen behalten</translation>
+    </message>
+    <message>
+        <source>Wrapped, with one word too long: site_west_building_4_main_entrance_camera_17_2026_04_01.mkv</source>
+        <translation>Umbrochen, mit einem zu langen Wort: standort_west_gebaeude_4_haupteingang_kamera_17_2026_04_01.mkv</translation>
+    </message>
+</context>
+<context>
     <name>gallery::MouseGesturesPage</name>
     <message>
         <source>Pressed</source>
@@ -602,6 +792,22 @@
     <message>
         <source>MultiFilterModel searches 10,000 devices while you type; FlexibleTableModel and TableViewDelegate show them as a wall whose columns follow the width.</source>
         <translation>MultiFilterModel durchsucht 10.000 Geräte während der Eingabe; FlexibleTableModel und TableViewDelegate zeigen sie als Wand, deren Spalten der Breite folgen.</translation>
+    </message>
+    <message>
+        <source>Click variants</source>
+        <translation>Klickarten</translation>
+    </message>
+    <message>
+        <source>Labels</source>
+        <translation>Beschriftungen</translation>
+    </message>
+    <message>
+        <source>ElidedLabel and ElidedButton shorten their text to the room they have; Label covers itself with a picture that keeps its proportions.</source>
+        <translation>ElidedLabel und ElidedButton kürzen ihren Text auf den vorhandenen Platz; Label füllt sich mit einem Bild, das seine Proportionen behält.</translation>
+    </message>
+    <message>
+        <source>TCustomClickWidget tells short, long and context clicks apart and asks for rights; CustomContextClickToolButton adds an arrow.</source>
+        <translation>TCustomClickWidget unterscheidet kurze, lange und Kontextklicks und fragt nach Rechten; CustomContextClickToolButton hat dazu einen Pfeil.</translation>
     </message>
 </context>
 <context>

@@ -211,6 +211,141 @@
     </message>
 </context>
 <context>
+    <name>gallery::ClickVariantsPage</name>
+    <message>
+        <source>The last click</source>
+        <translation>Le dernier clic</translation>
+    </message>
+    <message>
+        <source>None yet</source>
+        <translation>Aucun</translation>
+    </message>
+    <message>
+        <source>Click, hold or right click one of the buttons.</source>
+        <translation>Cliquez, maintenez ou cliquez droit sur un des boutons.</translation>
+    </message>
+    <message>
+        <source>Long click</source>
+        <translation>Clic long</translation>
+    </message>
+    <message>
+        <source>The button clicked by itself, the mouse still down.</source>
+        <translation>Le bouton a cliqué de lui-même, souris encore enfoncée.</translation>
+    </message>
+    <message>
+        <source>The button clicked on the release.</source>
+        <translation>Le bouton a cliqué au relâchement.</translation>
+    </message>
+    <message>
+        <source>Context click</source>
+        <translation>Clic contextuel</translation>
+    </message>
+    <message>
+        <source>A right click is a click of its own kind and opens no menu.</source>
+        <translation>Un clic droit est un clic à part et n&apos;ouvre aucun menu.</translation>
+    </message>
+    <message>
+        <source>Click on the arrow</source>
+        <translation>Clic sur la flèche</translation>
+    </message>
+    <message>
+        <source>The slot opens what it wants.</source>
+        <translation>Le slot ouvre ce qu&apos;il veut.</translation>
+    </message>
+    <message>
+        <source>Normal click</source>
+        <translation>Clic normal</translation>
+    </message>
+    <message>
+        <source>Hold the button longer, or use the other mouse button.</source>
+        <translation>Maintenez le bouton plus longtemps, ou utilisez l&apos;autre bouton de la souris.</translation>
+    </message>
+    <message>
+        <source>Kinds of clicks</source>
+        <translation>Sortes de clics</translation>
+    </message>
+    <message>
+        <source>Hold</source>
+        <translation>Maintenir</translation>
+    </message>
+    <message>
+        <source>Clicks by itself after 750 ms.</source>
+        <translation>Clique de lui-même après 750 ms.</translation>
+    </message>
+    <message>
+        <source>Hold and release</source>
+        <translation>Maintenir et relâcher</translation>
+    </message>
+    <message>
+        <source>Without automatic clicks.</source>
+        <translation>Sans clics automatiques.</translation>
+    </message>
+    <message>
+        <source>Checkable</source>
+        <translation>Commutable</translation>
+    </message>
+    <message>
+        <source>Held, it reports its state and keeps it.</source>
+        <translation>Maintenu, il signale son état et le garde.</translation>
+    </message>
+    <message>
+        <source>Split</source>
+        <translation>Divisé</translation>
+    </message>
+    <message>
+        <source>The arrow is a click of its own.</source>
+        <translation>La flèche est un clic à part.</translation>
+    </message>
+    <message>
+        <source>Rights</source>
+        <translation>Droits</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Export</translation>
+    </message>
+    <message>
+        <source>Needs the right to export.</source>
+        <translation>Demande le droit d&apos;exporter.</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Réglages</translation>
+    </message>
+    <message>
+        <source>For administrators.</source>
+        <translation>Pour les administrateurs.</translation>
+    </message>
+    <message>
+        <source>The user may export</source>
+        <translation>L&apos;utilisateur peut exporter</translation>
+    </message>
+    <message>
+        <source>The user is an administrator</source>
+        <translation>L&apos;utilisateur est administrateur</translation>
+    </message>
+    <message>
+        <source>A widget to click</source>
+        <translation>Un widget à cliquer</translation>
+    </message>
+    <message>
+        <source>Click me with any button</source>
+        <translation>Cliquez avec n&apos;importe quel bouton</translation>
+    </message>
+    <message>
+        <source>Click on a widget</source>
+        <translation>Clic sur un widget</translation>
+    </message>
+    <message>
+        <source>It has the signals of a button and is none.</source>
+        <translation>Il a les signaux d&apos;un bouton sans en être un.</translation>
+    </message>
+    <message>
+        <source>pressed, clicked and released, with every mouse button.</source>
+        <translation>pressed, clicked et released, avec chaque bouton de la souris.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::DeviceBrowserPage</name>
     <message>
         <source>North gate</source>
@@ -415,6 +550,61 @@
     </message>
 </context>
 <context>
+    <name>gallery::LabelsPage</name>
+    <message>
+        <source>Texts</source>
+        <translation>Textes</translation>
+    </message>
+    <message>
+        <source>Drag the bar between the two sides.</source>
+        <translation>Faites glisser la barre entre les deux côtés.</translation>
+    </message>
+    <message>
+        <source>The camera in the main entrance of building 4 does not answer any more</source>
+        <translation>La caméra de l&apos;entrée principale du bâtiment 4 ne répond plus</translation>
+    </message>
+    <message>
+        <source>Cut at the end</source>
+        <translation>Coupé à la fin</translation>
+    </message>
+    <message>
+        <source>In the middle</source>
+        <translation>Au milieu</translation>
+    </message>
+    <message>
+        <source>At the start</source>
+        <translation>Au début</translation>
+    </message>
+    <message>
+        <source>Word wrap</source>
+        <translation>Retour à la ligne</translation>
+    </message>
+    <message>
+        <source>Connect the camera in the main entrance of building 4</source>
+        <translation>Connecter la caméra de l&apos;entrée principale du bâtiment 4</translation>
+    </message>
+    <message>
+        <source>Button</source>
+        <translation>Bouton</translation>
+    </message>
+    <message>
+        <source>The text itself stays whole, in tool tips and for the program: %1</source>
+        <translation>Le texte reste entier, pour le programme et les bulles d&apos;aide : %1</translation>
+    </message>
+    <message>
+        <source>Pictures</source>
+        <translation>Images</translation>
+    </message>
+    <message>
+        <source>Keep the proportions</source>
+        <translation>Garder les proportions</translation>
+    </message>
+    <message>
+        <source>Wrapped, with one word too long: site_west_building_4_main_entrance_camera_17_2026_04_01.mkv</source>
+        <translation>Avec retour à la ligne et un mot trop long : site_ouest_batiment_4_entree_principale_camera_17_2026_04_01.mkv</translation>
+    </message>
+</context>
+<context>
     <name>gallery::MouseGesturesPage</name>
     <message>
         <source>Pressed</source>
@@ -602,6 +792,22 @@
     <message>
         <source>MultiFilterModel searches 10,000 devices while you type; FlexibleTableModel and TableViewDelegate show them as a wall whose columns follow the width.</source>
         <translation>MultiFilterModel cherche parmi 10 000 appareils pendant la saisie ; FlexibleTableModel et TableViewDelegate les montrent en un mur dont les colonnes suivent la largeur.</translation>
+    </message>
+    <message>
+        <source>Click variants</source>
+        <translation>Variantes de clic</translation>
+    </message>
+    <message>
+        <source>Labels</source>
+        <translation>Étiquettes</translation>
+    </message>
+    <message>
+        <source>ElidedLabel and ElidedButton shorten their text to the room they have; Label covers itself with a picture that keeps its proportions.</source>
+        <translation>ElidedLabel et ElidedButton raccourcissent leur texte selon la place disponible ; Label se couvre d&apos;une image qui garde ses proportions.</translation>
+    </message>
+    <message>
+        <source>TCustomClickWidget tells short, long and context clicks apart and asks for rights; CustomContextClickToolButton adds an arrow.</source>
+        <translation>TCustomClickWidget distingue les clics courts, longs et contextuels et demande les droits ; CustomContextClickToolButton ajoute une flèche.</translation>
     </message>
 </context>
 <context>
