@@ -68,7 +68,8 @@ Container::~Container()
 
 void Container::setSpacing(int spacing)
 {
-    m_layout->setSpacing(spacing);
+    // Beyond the size of a widget Qt's layouts count pixel by pixel for minutes.
+    m_layout->setSpacing(qMin(spacing, QWIDGETSIZE_MAX));
 }
 
 int Container::spacing() const

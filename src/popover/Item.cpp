@@ -317,7 +317,8 @@ void Item::setSpacing(int spacing)
     m_spacing = spacing;
     for (QHBoxLayout* layout : {m_mainLayout, m_leftLayout, m_rightLayout}) {
         if (layout) {
-            layout->setSpacing(spacing);
+            // Beyond the size of a widget Qt's layouts count pixel by pixel for minutes.
+            layout->setSpacing(qMin(spacing, QWIDGETSIZE_MAX));
         }
     }
 }

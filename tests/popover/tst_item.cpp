@@ -13,6 +13,8 @@
 #include <QtTest/QtTest>
 #include <QtWidgets/QGraphicsDropShadowEffect>
 
+#include <limits>
+
 using itemtest::Rights;
 using itemtest::Row;
 using vx::PopoverWidget::EItemFlag;
@@ -360,6 +362,8 @@ private Q_SLOTS:
         QCOMPARE(row.m_mainLayout->contentsMargins(), QMargins(3, 0, 4, 0));
         QCOMPARE(row.leftMargin(), 3);
         QCOMPARE(row.rightMargin(), 4);
+        row.setSpacing(std::numeric_limits<int>::max());
+        QCOMPARE(row.spacing(), std::numeric_limits<int>::max());
         Row bare(itemtest::c_NoFlags);
         bare.setSpacing(2);
         QCOMPARE(bare.m_mainLayout->spacing(), 2);

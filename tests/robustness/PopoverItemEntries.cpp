@@ -141,6 +141,7 @@ Entry popoverContainer(const char* name, const char* header)
         auto* const container = new Class(host, QStringLiteral("container"), Qt::Vertical, Qt::AlignTop);
         container->resize(200, 200);
         container->addItem(new ExercisedRow(nullptr), pw::ecfDismiss | pw::ecfDismissAll);
+        container->addItem(new ExercisedRow(nullptr));
         return Subject{container, container};
     };
     entry.exercise = {
