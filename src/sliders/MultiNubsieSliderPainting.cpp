@@ -57,6 +57,7 @@ void MultiNubsieSlider::paintEvent(QPaintEvent* event)
     if (!isEnabled()) {
         // Only the handles of a disabled slider look it.
         palette.setCurrentColorGroup(isActiveWindow() ? QPalette::Active : QPalette::Inactive);
+        painter.setPen(palette.color(foregroundRole()));
     }
     painter.fillRect(QRect(0, 0, option.rect.width() - 1, option.rect.height() - 1), palette.color(QPalette::Window));
     if (m_drawTrack) {

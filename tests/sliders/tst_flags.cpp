@@ -21,8 +21,7 @@ QLabel* label(QWidget* flag)
 
 QPixmap pictureOf(QWidget* flag)
 {
-    const QPixmap* const pixmap = label(flag)->pixmap();
-    return pixmap != nullptr ? *pixmap : QPixmap();
+    return flag->property("pixmap").value<QPixmap>();
 }
 
 QImage scaled(const char* name, int side)

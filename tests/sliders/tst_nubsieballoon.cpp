@@ -37,6 +37,18 @@ struct Row : Item
     void pick() { performSingleClick(QFlags<vx::PopoverWidget::EItemPerformedFlag>()); }
 };
 
+// The arguments of all valueChangedbyPopover().
+QList<QVariantList> picked(const SignalRecorder& recorder)
+{
+    QList<QVariantList> result;
+    for (const SignalRecorder::Entry& entry : recorder.entries()) {
+        if (entry.name == QLatin1String("valueChangedbyPopover")) {
+            result << entry.arguments;
+        }
+    }
+    return result;
+}
+
 struct Scene
 {
     Scene()
@@ -248,8 +260,7 @@ void TestNubsieBalloon::whatIsPickedBecomesTheValue()
     scene.handle->showValuePopover();
     SignalRecorder recorder(scene.handle);
     eight->pick();
-    QCOMPARE(recorder.names().first(), QStringLiteral("valueChangedbyPopover"));
-    QCOMPARE(recorder.entries().first().arguments, QVariantList({8}));
+    QCOMPARE(picked(recorder), QList<QVariantList>({{8}}));
     QCOMPARE(recorder.count(QStringLiteral("valueChanged")), 0);
     QCOMPARE(scene.handle->value(), 8);
     QCOMPARE(scene.handle->getDisplayValue(), 0.3);
@@ -267,7 +278,7 @@ void TestNubsieBalloon::whatAnInvertedHandleIsGivenIsTurnedRound()
     nine->pick();
     QCOMPARE(scene.handle->value(true), 1);
     QCOMPARE(scene.handle->value(), 9);
-    QCOMPARE(recorder.entries().first().arguments, QVariantList({1}));
+    QCOMPARE(picked(recorder), QList<QVariantList>({{1}}));
 }
 
 void TestNubsieBalloon::onlyAWholeNumberCanBePicked()

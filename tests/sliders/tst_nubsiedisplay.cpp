@@ -90,7 +90,7 @@ private Q_SLOTS:
     void anIconMapGivesTheIconOfTheTrueValue();
     void ofSeveralSourcesTheFirstOneWins();
     void withABalloonTheImageIsKept();
-    void twoDigitsMakeAPillAndOneDigitASquareAgain();
+    void manyDigitsMakeAPillAndOneDigitASquareAgain();
     void withoutADraggedSizeNothingIsFitted();
     void aSizeResizesAboutThePoint();
     void theSizeAtRestIsTakenAtOnce();
@@ -282,16 +282,16 @@ void TestNubsieDisplay::withABalloonTheImageIsKept()
     QVERIFY(same(handle.icon(), valueBadge(QStringLiteral("50"))));
 }
 
-void TestNubsieDisplay::twoDigitsMakeAPillAndOneDigitASquareAgain()
+void TestNubsieDisplay::manyDigitsMakeAPillAndOneDigitASquareAgain()
 {
-    Handle handle(nullptr, 9);
+    Handle handle(nullptr, 9, 100000);
     handle.setSize(QSize(20, 20));
     handle.setDraggedSize(QSize(40, 40));
     handle.give(Nubsie::enfValueBadge);
     QCOMPARE(handle.getSize(), QSize(20, 20));
-    const QSize badge = valueBadge(QStringLiteral("10")).size();
+    const QSize badge = valueBadge(QStringLiteral("1000")).size();
     QVERIFY(badge.width() > badge.height());
-    handle.setValue(10);
+    handle.setValue(1000);
     QCOMPARE(handle.getSize(), vx::NubsieMath::widened(QSize(20, 20), badge));
     QCOMPARE(handle.getDraggedSize(), vx::NubsieMath::widened(QSize(40, 40), badge));
     QCOMPARE(handle.getCurrentSize(), handle.getSize());
@@ -299,7 +299,7 @@ void TestNubsieDisplay::twoDigitsMakeAPillAndOneDigitASquareAgain()
     QVERIFY(handle.getSize().width() > 20);
     // A longer number keeps the first pill.
     const QSize pill = handle.getSize();
-    handle.setValue(100);
+    handle.setValue(10000);
     QCOMPARE(handle.getSize(), pill);
     handle.setValue(9);
     QCOMPARE(handle.getSize(), QSize(20, 20));
@@ -310,7 +310,7 @@ void TestNubsieDisplay::twoDigitsMakeAPillAndOneDigitASquareAgain()
 
 void TestNubsieDisplay::withoutADraggedSizeNothingIsFitted()
 {
-    Handle handle(nullptr, 10);
+    Handle handle(nullptr, 1000, 1000);
     handle.setSize(QSize(20, 20));
     handle.give(Nubsie::enfValueBadge);
     QCOMPARE(handle.getSize(), QSize(20, 20));
