@@ -61,7 +61,7 @@ struct RobustNubsie : vx::Nubsie
     QPointer<NubsieRow> row;
 };
 
-Entry nubsie()
+Entry nubsieEntry()
 {
     Entry entry;
     entry.name = "Nubsie";
@@ -103,6 +103,6 @@ Entry nubsie()
 
 std::vector<Entry> nubsieEntries()
 {
-    return {nubsie()};
+    return {nubsieEntry()};
 }
 }

@@ -241,8 +241,11 @@ void TestNubsieDisplay::anIconMapGivesTheIconOfTheTrueValue()
     handle.give(Nubsie::enfInverted);
     handle.setIconMap({{{0, 10}, low}, {{5, 20}, high}});
     QCOMPARE(handle.icon().cacheKey(), low.cacheKey());
+    handle.setSize(QSize(20, 20));
+    QVERIFY(isColor(painted(handle), QPoint(10, 10), Qt::blue));
     handle.setValue(11);
     QCOMPARE(handle.icon().cacheKey(), high.cacheKey());
+    QVERIFY(isColor(painted(handle), QPoint(10, 10), Qt::red));
     handle.setValue(21);
     QCOMPARE(handle.icon().cacheKey(), high.cacheKey());
     handle.setIconMap({});
