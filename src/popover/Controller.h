@@ -134,7 +134,8 @@ Q_SIGNALS:
     /// Escape was released in a popover that stays visible.
     void shouldReject();
     /// An item of the content was performed.
-    void itemPerformed(int itemId, QVariant value, QVariant userData, vx::PopoverWidget::EItemPerformedFlags flag);
+    void itemPerformed(int itemId, const QVariant& value, const QVariant& userData,
+        vx::PopoverWidget::EItemPerformedFlags flag);
     void marginsChanged(int left, int top, int right, int bottom);
     /// A layout pass has run. A resize of the window runs more than one.
     void layoutUpdated();
@@ -143,7 +144,7 @@ Q_SIGNALS:
     /// Something in the format Item::sPopoverWidgetItem was dropped on the overlay or the balloon. \a item is the
     /// source of the drag if that is an item, else null: a drag that an item has begun by itself belongs to the
     /// item's window, and its id stands in the data. The event is valid during the emission only.
-    void itemDropped(vx::PopoverWidget::Item* item, QDropEvent* dropEvent, QPoint globalPos);
+    void itemDropped(vx::PopoverWidget::Item* item, QDropEvent* dropEvent, const QPoint& globalPos);
 
 public Q_SLOTS:
     /// Opens or closes. Closing this way asks and tells the container nothing.

@@ -5,6 +5,9 @@
 #include <QMargins>
 #include <QRect>
 #include <Qt>
+#include <QtGlobal>
+
+#include <limits>
 
 namespace vx
 {
@@ -70,11 +73,32 @@ constexpr EKeyVerdict keyVerdict(int key, bool visible, bool stayVisible, bool c
     return !visible || stayVisible ? EKeyVerdict::Reject : closing ? EKeyVerdict::Ignore : EKeyVerdict::Dismiss;
 }
 
+/// The sum, or the end of the range that it would leave.
+inline int saturatedSum(int a, int b)
+{
+    const qint64 sum = qint64(a) + b;
+    return static_cast<int>(qBound(qint64(std::numeric_limits<int>::min()), sum,
+        qint64(std::numeric_limits<int>::max())));
+}
+
+inline QMargins saturatedSum(const QMargins& a, const QMargins& b)
+{
+    return {saturatedSum(a.left(), b.left()), saturatedSum(a.top(), b.top()), saturatedSum(a.right(), b.right()),
+        saturatedSum(a.bottom(), b.bottom())};
+}
+
 /// The area left of \a covered: insets are added as they stand, so that right and bottom ones shrink it only if they
-/// are negative; margins go inwards.
+/// are negative; margins go inwards. Edges end where no widget can be.
 inline QRect coveredArea(const QRect& covered, const QMargins& insets, const QMargins& margins)
 {
-    return covered.adjusted(insets.left(), insets.top(), insets.right(), insets.bottom()).marginsRemoved(margins);
+    const auto edge = [](int at, int inset, qint64 margin) {
+        constexpr qint64 far = 1 << 24;
+        return static_cast<int>(qBound(-far, qint64(at) + inset + margin, far));
+    };
+    return {QPoint(edge(covered.left(), insets.left(), margins.left()),
+                edge(covered.top(), insets.top(), margins.top())),
+        QPoint(edge(covered.right(), insets.right(), -qint64(margins.right())),
+            edge(covered.bottom(), insets.bottom(), -qint64(margins.bottom())))};
 }
 }
 }

@@ -1,0 +1,145 @@
+// SPDX-License-Identifier: MIT
+// vx::PopoverWidget::Controller: clicks outside, keys, drops, and what happens to the widgets around it.
+#include "popover/Controller.h"
+
+#include "popover/Container.h"
+#include "popover/ControllerVerdicts.h"
+
+#include <QDragEnterEvent>
+#include <QDragLeaveEvent>
+#include <QDragMoveEvent>
+#include <QDropEvent>
+#include <QKeyEvent>
+#include <QList>
+#include <QMimeData>
+#include <QMouseEvent>
+#include <QResizeEvent>
+#include <QShowEvent>
+
+namespace vx
+{
+namespace PopoverWidget
+{
+void Controller::mousePressEvent(QMouseEvent* event)
+{
+    if (m_balloon != nullptr
+        && isPressOutside(m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible)) {
+        m_pressedOutside = true;
+    }
+    FadableThing<QWidget>::mousePressEvent(event);
+}
+
+void Controller::mouseReleaseEvent(QMouseEvent* event)
+{
+    const bool pressedOutside = m_pressedOutside;
+    m_pressedOutside = false;
+    if (m_balloon == nullptr) {
+        FadableThing<QWidget>::mouseReleaseEvent(event);
+        return;
+    }
+    if (isClickOutside(
+            pressedOutside, m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible)) {
+        dismiss(true, false);
+        event->accept();
+    }
+}
+
+void Controller::keyReleaseEvent(QKeyEvent* event)
+{
+    switch (keyVerdict(event->key(), isVisible(), m_stayVisible, m_closing)) {
+    case EKeyVerdict::NotOurs:
+        FadableThing<QWidget>::keyReleaseEvent(event);
+        return;
+    case EKeyVerdict::Ignore:
+        event->ignore();
+        return;
+    case EKeyVerdict::Reject:
+        Q_EMIT shouldReject();
+        break;
+    case EKeyVerdict::Dismiss:
+        // Forced: the container is not asked.
+        dismiss(false, true);
+        break;
+    case EKeyVerdict::Accept:
+        Q_EMIT shouldAccept();
+        break;
+    }
+    event->accept();
+}
+
+bool Controller::eventFilter(QObject* watched, QEvent* event)
+{
+    if (!isVisible()) {
+        return false;
+    }
+    const QPointer<Controller> self(this);
+    const bool resized = event->type() == QEvent::Resize;
+    if (resized && watched == m_inWidget) {
+        resizeEvent(static_cast<QResizeEvent*>(event));
+    }
+    if (self != nullptr && (resized || event->type() == QEvent::Move) && watched == m_forWidget
+        && m_balloon != nullptr) {
+        m_balloon->setupLayout(false);
+    }
+    return false;
+}
+
+void Controller::resizeEvent(QResizeEvent* event)
+{
+    const QPointer<Controller> self(this);
+    updateLayout(false);
+    if (self == nullptr) {
+        return;
+    }
+    FadableThing<QWidget>::resizeEvent(event);
+    QList<QPointer<Controller>> nested;
+    const QList<Controller*> found = findChildren<Controller*>();
+    for (Controller* controller : found) {
+        nested << controller;
+    }
+    for (const QPointer<Controller>& controller : qAsConst(nested)) {
+        if (controller != nullptr) {
+            controller->event(event);
+        }
+    }
+}
+
+void Controller::showEvent(QShowEvent* event)
+{
+    const QPointer<Controller> self(this);
+    updateLayout(true);
+    if (self != nullptr) {
+        FadableThing<QWidget>::showEvent(event);
+    }
+}
+
+void Controller::dragEnterEvent(QDragEnterEvent* event)
+{
+    if (event->mimeData()->hasFormat(Item::sPopoverWidgetItem)) {
+        event->accept();
+    }
+    FadableThing<QWidget>::dragEnterEvent(event);
+}
+
+void Controller::dragMoveEvent(QDragMoveEvent* event)
+{
+    if (event->mimeData()->hasFormat(Item::sPopoverWidgetItem)) {
+        event->accept();
+    }
+    FadableThing<QWidget>::dragMoveEvent(event);
+}
+
+void Controller::dragLeaveEvent(QDragLeaveEvent* event)
+{
+    FadableThing<QWidget>::dragLeaveEvent(event);
+}
+
+void Controller::dropEvent(QDropEvent* event)
+{
+    if (event->mimeData()->hasFormat(Item::sPopoverWidgetItem)) {
+        event->accept();
+        Q_EMIT itemDropped(qobject_cast<Item*>(event->source()), event, mapToGlobal(event->pos()));
+    }
+}
+}
+}
