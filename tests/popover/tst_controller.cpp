@@ -2,6 +2,7 @@
 // Content, place, opening and closing of a popover's controller.
 #include "popover/Controller.h"
 
+#include <QtCore/QPropertyAnimation>
 #include <QtTest/QtTest>
 #include <QtWidgets/QLineEdit>
 #include <QtWidgets/QScrollArea>
@@ -328,6 +329,7 @@ private Q_SLOTS:
         const bool fades = animated && (flags & 4) == 0;
         PopoverScene scene;
         TestController* const controller = scene.build();
+        controller->balloon()->findChild<QPropertyAnimation*>()->setDuration(60);
         SignalRecorder recorder(controller);
         controller->setActive(true, showFlags(flags), animated);
         QVERIFY(controller->isActive());
@@ -351,7 +353,7 @@ private Q_SLOTS:
         QCOMPARE(scene.container->opened, balloonAtOnce || grows ? 1 : 0);
         QVERIFY(!controller->balloon()->content()->isHidden());
         if (balloonAtOnce || grows) {
-            QCOMPARE(controller->balloon()->geometry(), QRect(120, 40, 160, 120));
+            QCOMPARE(controller->balloon()->geometry(), QRect(119, 39, 160, 120));
         }
     }
 
@@ -367,14 +369,14 @@ private Q_SLOTS:
         QCOMPARE(animation->duration(), 400);
         QCOMPARE(animation->easingCurve().type(), QEasingCurve::OutBack);
         QCOMPARE(animation->startValue().toRect(), QRect(QPoint(199, 149), QSize()));
-        QCOMPARE(animation->endValue().toRect(), QRect(120, 40, 160, 120));
+        QCOMPARE(animation->endValue().toRect(), QRect(119, 39, 160, 120));
         QCOMPARE(animation->state(), QAbstractAnimation::Running);
         QTRY_VERIFY(scene.container->opened == 1);
-        QCOMPARE(controller->balloon()->geometry(), QRect(120, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(119, 39, 160, 120));
         controller->setPersistence(true);
         controller->dismiss(true, false);
         QCOMPARE(animation->easingCurve().type(), QEasingCurve::Linear);
-        QCOMPARE(animation->startValue().toRect(), QRect(120, 40, 160, 120));
+        QCOMPARE(animation->startValue().toRect(), QRect(119, 39, 160, 120));
         QCOMPARE(animation->endValue().toRect(), QRect(QPoint(199, 149), QSize()));
         QVERIFY(!controller->balloon()->layout()->isEnabled());
         QVERIFY(controller->balloon()->content()->isHidden());
@@ -431,6 +433,7 @@ private Q_SLOTS:
         QFETCH(bool, animated);
         PopoverScene scene;
         TestController* const controller = scene.build();
+        controller->balloon()->findChild<QPropertyAnimation*>()->setDuration(60);
         controller->setPersistence(true);
         controller->setActive(true, showFlags(flags), false);
         QTRY_VERIFY(!controller->balloon()->content()->isHidden());
@@ -638,7 +641,7 @@ private Q_SLOTS:
         QVERIFY(controller->balloon()->layout()->isEnabled());
         // The end of the shrinking that was left does not catch up.
         QVERIFY(!QTest::qWaitFor([&] { return !controller->isVisible(); }, 500));
-        QCOMPARE(controller->balloon()->geometry(), QRect(120, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(119, 39, 160, 120));
     }
 
     void closingAtOnceEndsTheGrowth()

@@ -19,7 +19,7 @@ using zelkovtest::TestController;
 
 namespace
 {
-// The balloon covers (120, 40) to (279, 159).
+// The balloon covers (119, 39) to (278, 158).
 constexpr QPoint c_inside(200, 100);
 constexpr QPoint c_outside(20, 280);
 }
@@ -38,12 +38,12 @@ private Q_SLOTS:
         QTest::newRow("press inside") << c_inside << c_outside << false;
         QTest::newRow("release inside") << c_outside << c_inside << false;
         QTest::newRow("both inside") << c_inside << c_inside << false;
-        QTest::newRow("first pixel inside") << QPoint(120, 40) << QPoint(120, 40) << false;
-        QTest::newRow("last pixel inside") << QPoint(279, 159) << QPoint(279, 159) << false;
-        QTest::newRow("left of the first") << QPoint(119, 100) << QPoint(119, 100) << true;
-        QTest::newRow("right of the last") << QPoint(280, 100) << QPoint(280, 100) << true;
-        QTest::newRow("above") << QPoint(200, 39) << QPoint(200, 39) << true;
-        QTest::newRow("below") << QPoint(200, 160) << QPoint(200, 160) << true;
+        QTest::newRow("first pixel inside") << QPoint(119, 39) << QPoint(119, 39) << false;
+        QTest::newRow("last pixel inside") << QPoint(278, 158) << QPoint(278, 158) << false;
+        QTest::newRow("left of the first") << QPoint(118, 100) << QPoint(118, 100) << true;
+        QTest::newRow("right of the last") << QPoint(279, 100) << QPoint(279, 100) << true;
+        QTest::newRow("above") << QPoint(200, 38) << QPoint(200, 38) << true;
+        QTest::newRow("below") << QPoint(200, 159) << QPoint(200, 159) << true;
     }
 
     void aClickCountsWherePressAndReleaseFall()
@@ -53,7 +53,7 @@ private Q_SLOTS:
         PopoverScene scene;
         TestController* const controller = scene.build();
         controller->setActive();
-        QCOMPARE(controller->balloon()->geometry(), QRect(QPoint(120, 40), QPoint(279, 159)));
+        QCOMPARE(controller->balloon()->geometry(), QRect(QPoint(119, 39), QPoint(278, 158)));
         PopoverScene::press(controller, press);
         QVERIFY(controller->isActive());
         PopoverScene::release(controller, release);
@@ -268,7 +268,7 @@ private Q_SLOTS:
         controller->setActive();
         SignalRecorder recorder(controller);
         scene.target->move(100, 60);
-        QCOMPARE(controller->balloon()->geometry(), QRect(40, 80, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(39, 79, 160, 120));
         scene.target->resize(60, 30);
         // The centre of a rectangle of 60 is at 29.
         QCOMPARE(controller->balloon()->geometry(), QRect(49, 89, 160, 120));
@@ -283,7 +283,7 @@ private Q_SLOTS:
         controller->setActive();
         controller->setActive(false, showFlags(1), false);
         scene.target->move(100, 60);
-        QCOMPARE(controller->balloon()->geometry(), QRect(120, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(119, 39, 160, 120));
     }
 
     void aNewTargetIsFollowedAndTheOldIsNot()
@@ -293,12 +293,13 @@ private Q_SLOTS:
         controller->setActive();
         QPushButton* const other = new QPushButton(scene.window);
         other->setGeometry(100, 20, 40, 20);
+        other->show();
         controller->setForWidget(*other, QPointF(-1, 0));
-        QCOMPARE(controller->balloon()->geometry(), QRect(40, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(39, 39, 160, 120));
         other->move(110, 20);
-        QCOMPARE(controller->balloon()->geometry(), QRect(50, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(49, 39, 160, 120));
         scene.target->move(0, 0);
-        QCOMPARE(controller->balloon()->geometry(), QRect(50, 40, 160, 120));
+        QCOMPARE(controller->balloon()->geometry(), QRect(49, 39, 160, 120));
     }
 
     void aTargetMayDieWhileThePopoverIsOpen()

@@ -4,6 +4,7 @@
 // that is asked.
 #include "popover/Manager.h"
 
+#include <QtCore/QPropertyAnimation>
 #include <QtCore/QTimer>
 #include <QtTest/QtTest>
 #include <QtWidgets/QDialogButtonBox>
@@ -54,13 +55,19 @@ struct Stage
     {
         Manager::init(0);
         scene.controller = new TestController(scene.window, scene.target);
-        scene.controller->fader()->setFadingTimes(30, 30);
-        Manager::instance()->addController(1, scene.controller);
+        Manager::instance()->addController(1, scene.controller.data());
         scene.makeContent(vx::PopoverWidget::ecfDismissAll);
         for (int i = 0; i < 12; ++i) {
             scene.container->addItem(new TestRow(100 + i));
         }
         scene.controller->setContainer(scene.container, QFlags<Balloon::EBalloonFeature>(QFlag(7)));
+        setTimes(10);
+    }
+    // Of fades, growth and shrinking, in ms.
+    void setTimes(int ms) const
+    {
+        scene.controller->fader()->setFadingTimes(ms, ms);
+        scene.controller->balloon()->findChild<QPropertyAnimation*>()->setDuration(ms);
     }
     ~Stage()
     {
@@ -143,7 +150,7 @@ struct Stage
     // Uses the popover in every way, opened with these flags.
     void play(int flags, bool animated)
     {
-        const int wait = (flags & 2) != 0 ? 460 : animated ? 60 : 0;
+        const int wait = (flags & 2) != 0 || animated ? 25 : 0;
         if (scene.controller == nullptr) {
             return;
         }
@@ -175,13 +182,13 @@ struct Stage
             PopoverScene::click(scene.row, scene.row->rect().center());
         }
         ifOpen([](TestController* controller) { PopoverScene::click(controller, QPoint(10, 290)); });
-        settle(wait != 0 ? wait : 60);
+        settle(25);
         if (scene.controller != nullptr) {
             scene.controller->setActive(true, showFlags(flags), animated);
         }
         settle(wait);
         clickButton("popoverCloseButton");
-        settle(wait != 0 ? wait : 60);
+        settle(25);
         // Dismissed by a row, and hidden beforehand.
         if (scene.controller != nullptr && scene.container != nullptr) {
             if (scene.row != nullptr) {
@@ -314,7 +321,7 @@ private Q_SLOTS:
         QFETCH(Victim, victim);
         Stage stage;
         TestController* const controller = stage.scene.controller;
-        controller->fader()->setFadingTimes(150, 150);
+        stage.setTimes(100);
         controller->setPersistence(true);
         controller->setActive(true, showFlags(flags), opening);
         if (!opening) {
@@ -324,7 +331,7 @@ private Q_SLOTS:
         // In the midst of it.
         QTest::qWait(40);
         stage.destroy(victim);
-        QTest::qWait(500);
+        QTest::qWait(120);
         if (stage.scene.controller != nullptr) {
             stage.scene.controller->setActive(true, showFlags(flags), true);
         }
@@ -357,7 +364,7 @@ private Q_SLOTS:
             }
         });
         // What is left of it is closed, so that the loop ends.
-        QTimer::singleShot(100, &context, [&] {
+        QTimer::singleShot(40, &context, [&] {
             if (stage.scene.controller != nullptr) {
                 stage.scene.controller->setActive(false, showFlags(5), false);
             }
@@ -382,7 +389,7 @@ private Q_SLOTS:
         TestController* const outer = stage.scene.controller;
         outer->setActive();
         const QPointer<TestController> inner = new TestController(outer, outer->balloon());
-        Manager::instance()->addController(2, inner);
+        Manager::instance()->addController(2, inner.data());
         inner->setContainer(new TestContainer, QFlags<Balloon::EBalloonFeature>(QFlag(7)));
         zelkovtest::Saboteur saboteur(inner, zelkovtest::signalIndex(inner, signal),
             [&] { delete stage.scene.controller.data(); });

@@ -31,7 +31,7 @@ public:
         scene.controller = new TestController(scene.window, scene.target);
         scene.controller->fader()->setFadingTimes(40, 40);
         recorder.add(scene.controller);
-        Manager::instance()->addController(id, scene.controller);
+        Manager::instance()->addController(id, scene.controller.data());
         scene.makeContent(containerFlags);
         recorder.add(scene.container);
         scene.controller->setContainer(scene.container, QFlags<Balloon::EBalloonFeature>(QFlag(7)));
@@ -63,7 +63,8 @@ private:
 
 QStringList list(const char* text)
 {
-    return QString::fromLatin1(text).simplified().split(QLatin1Char(' '), QString::SkipEmptyParts);
+    const QString words = QString::fromLatin1(text).simplified();
+    return words.isEmpty() ? QStringList() : words.split(QLatin1Char(' '));
 }
 
 const char c_opened[] = "controller.popoverWillAppear manager.popoverWillOpen manager.modalPopoverWillOpen "

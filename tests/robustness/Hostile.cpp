@@ -64,6 +64,12 @@ QList<QPair<QByteArray, Sabotage>> allSabotages()
         {"reparent", Sabotage::Reparent}};
 }
 
+bool deletes(Sabotage sabotage)
+{
+    return sabotage == Sabotage::DeleteSender || sabotage == Sabotage::DeleteWindow
+        || sabotage == Sabotage::DeleteLaterInNestedLoop;
+}
+
 void paint(QWidget* widget)
 {
     if (widget->size().isEmpty()) {

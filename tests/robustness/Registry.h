@@ -63,6 +63,8 @@ struct Entry
     std::function<Subject(QWidget* host)> create;
     std::vector<Script> exercise;
     std::vector<Setter> setters;
+    /// Signals of the destructor: nobody deletes the sender, or what it stands in, a second time then.
+    QList<QByteArray> farewells;
 
     /// Names of all signals that the scripts promise, each once.
     QList<QByteArray> expectedSignals() const;
@@ -83,6 +85,7 @@ std::vector<Entry> slidersEntries();
 std::vector<Entry> popoverItemEntries();
 std::vector<Entry> modelsEntries();
 std::vector<Entry> switchEntries();
+std::vector<Entry> controllerEntries();
 
 // --- Words for entries -----------------------------------------------------------------------------------------
 

@@ -25,6 +25,7 @@ enum class Sabotage : int
 };
 
 QList<QPair<QByteArray, Sabotage>> allSabotages();
+bool deletes(Sabotage sabotage);
 
 /// Uses an instance by the first script that promises @p signal and does @p sabotage when it fires first. That the
 /// signal does not fire at all is a fault.
