@@ -88,7 +88,7 @@ Entry controllerEntry()
         Controller* const controller = popoverOfManager(host);
         return Subject{controller, controller};
     };
-    const Step performRow = [](const Subject& subject) {
+    const Step performSecond = [](const Subject& subject) {
         Item* const row = controllerOf(subject)->getContainer()->getItem(2);
         QMouseEvent event(QEvent::MouseButtonRelease, row->rect().center(), Qt::LeftButton, Qt::NoButton,
             Qt::NoModifier);
@@ -119,7 +119,7 @@ Entry controllerEntry()
         {"help", {"popoverWillHelp"}, {call(&Controller::help)}},
         {"keys", {"shouldReject", "shouldAccept"},
             {releaseKey(Qt::Key_Escape), openPopover(5, true), releaseKey(Qt::Key_Return)}},
-        {"a row", {"itemPerformed"}, {openPopover(5, true), performRow}},
+        {"a row", {"itemPerformed"}, {openPopover(5, true), performSecond}},
         {"a drop", {"itemDropped"}, {openPopover(5, true), dropItem}},
         {"the end", {"controllerDestroyed"},
             {openPopover(5, true), call(&Controller::setPersistence, false), dismissPopover(false),
