@@ -12,9 +12,9 @@
 #include <memory>
 
 #include "../Hand.h"
-#include "ZelkovUtils/ISecurityManager.h"
 #include "input/CustomClickQWidget.h"
 #include "input/CustomContextClickToolButton.h"
+#include "ZelkovUtils/ISecurityManager.h"
 
 namespace gallery
 {
@@ -128,8 +128,7 @@ QVBoxLayout* column(QWidget* panel, QLabel* heading)
     return layout;
 }
 
-template <class Button>
-Button* furnish(Button* button, const QPixmap& icon)
+template <class Button> Button* furnish(Button* button, const QPixmap& icon)
 {
     button->setIcon(icon);
     button->setIconSize(QSize(c_iconExtent, c_iconExtent));
@@ -247,8 +246,7 @@ QWidget* ClickVariantsPage::makeRights()
     const auto rights = std::make_shared<Rights>();
     Adapter::setSecurityManager(rights);
 
-    m_guarded = furnish(
-        new Button(nullptr, Adapter::s_DefaultLongClickSpan, false), picture(drawExport, ink));
+    m_guarded = furnish(new Button(nullptr, Adapter::s_DefaultLongClickSpan, false), picture(drawExport, ink));
     m_guarded->setSecurityCheck(QStringLiteral("export"));
     watch(m_guarded, QStringLiteral("export"));
     auto* admin = furnish(new Button(nullptr, Adapter::s_DefaultLongClickSpan, false), picture(drawLock, ink));

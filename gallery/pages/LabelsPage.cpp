@@ -11,8 +11,8 @@
 #include <QtWidgets/QSplitterHandle>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/Scene.h"
+#include "../Hand.h"
 #include "indicators/ElidedButton.h"
 #include "indicators/ElidedLabel.h"
 #include "indicators/Label.h"

@@ -12,8 +12,8 @@
 class QPaintEvent;
 class QStyleOptionButton;
 
-/// A QPushButton that can shorten its text to its width when it is painted; text() stays whole. As it comes it shows
-/// the whole text: call setElideMode(). Its size hint is that of the whole text.
+/// A QPushButton that can shorten its text to its width when it is painted; text() stays whole. As it comes it
+/// shows the whole text: call setElideMode(). Its size hint is that of the whole text.
 ///
 /// The room for the text ends before the place of a menu indicator, whether there is a menu or not; an icon is not
 /// taken into account.

@@ -11,12 +11,12 @@ class QPaintEvent;
 
 namespace vx
 {
-/// A QLabel for plain text that is shortened to the label's width when it is painted; text() stays whole. With word
-/// wrap the text wraps, and only words wider than the label are shortened, each for itself.
+/// A QLabel for plain text that is shortened to the label's width when it is painted; text() stays whole. With
+/// word wrap the text wraps, and only words wider than the label are shortened, each for itself.
 ///
 /// Its size hints are those of the whole text: in a layout that is to shrink it, give it the size policy
-/// QSizePolicy::Ignored or a minimum width. Rich text, pictures and mnemonics are not shown as such, and the margin
-/// of QLabel does not count; the indent does where one is set.
+/// QSizePolicy::Ignored or a minimum width. Rich text, pictures and mnemonics are not shown as such, and the
+/// margin of QLabel does not count; the indent does where one is set.
 class ZELKOV_WIDGETS_EXPORT ElidedLabel : public QLabel
 {
     Q_OBJECT

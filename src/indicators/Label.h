@@ -12,8 +12,8 @@ class QPaintEvent;
 
 namespace vx
 {
-/// A QLabel that, with scaled contents, scales its picture so that it covers the label and keeps its proportions: it
-/// stands centred and is cut where it overhangs. Without scaled contents it is a QLabel.
+/// A QLabel that, with scaled contents, scales its picture so that it covers the label and keeps its proportions:
+/// it stands centred and is cut where it overhangs. Without scaled contents it is a QLabel.
 class ZELKOV_WIDGETS_EXPORT Label : public QLabel
 {
     Q_OBJECT

@@ -21,8 +21,8 @@ inline QRect indented(const QRect& rect, Qt::Alignment alignment, int indent)
         alignment.testFlag(Qt::AlignRight) ? -i : 0, alignment.testFlag(Qt::AlignBottom) ? -i : 0);
 }
 
-/// Where the top left corner of a picture that covers the frame goes, so that what it overhangs in one direction is
-/// halved between both sides. Integer division.
+/// Where the top left corner of a picture that covers the frame goes, so that what it overhangs in one direction
+/// is halved between both sides. Integer division.
 inline QPoint coverOrigin(const QRect& frame, const QSize& picture)
 {
     if (picture.width() > frame.width()) {

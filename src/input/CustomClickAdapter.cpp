@@ -2,8 +2,8 @@
 // What tells short from long clicks on a button and asks whether the user may click at all.
 #include "input/CustomClickAdapter.h"
 
-#include "ZelkovUtils/ISecurityManager.h"
 #include "input/ClickVerdict.h"
+#include "ZelkovUtils/ISecurityManager.h"
 
 #include <QPointer>
 #include <QWidget>

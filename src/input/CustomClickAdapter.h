@@ -16,23 +16,23 @@ namespace vx
 {
 class ISecurityManager;
 
-/// A mix-in beside a button class: it times how long the button is held, keeps the kind of the last click, and asks
-/// the application's security manager before a click. It connects nothing and handles no events itself;
+/// A mix-in beside a button class: it times how long the button is held, keeps the kind of the last click, and
+/// asks the application's security manager before a click. It connects nothing and handles no events itself;
 /// TCustomClickWidget puts it together with Qt's tool button.
 class ZELKOV_WIDGETS_EXPORT CustomClickAdapter
 {
 public:
     enum EClickType
     {
-        ectNone = 0,    ///< nothing was clicked yet
-        ectNormal = 1,  ///< a press, so far
-        ectLong = 2,    ///< held for the long click span
+        ectNone = 0, ///< nothing was clicked yet
+        ectNormal = 1, ///< a press, so far
+        ectLong = 2, ///< held for the long click span
         ectContext = 4, ///< a right click or what the desktop has instead
-        ectArrow = 6,   ///< a press on the arrow of CustomContextClickToolButton
+        ectArrow = 6, ///< a press on the arrow of CustomContextClickToolButton
     };
 
     static const int s_DefaultLongClickTimeout; ///< 750 ms
-    static const int s_DefaultLongClickSpan;    ///< 750 ms
+    static const int s_DefaultLongClickSpan; ///< 750 ms
 
     /// \a owner is the button, which must not die before this object; \a longClickSpan is in milliseconds.
     CustomClickAdapter(QWidget* owner, int longClickSpan);
@@ -44,7 +44,8 @@ public:
     /// click, for one, is judged by its time again.
     EClickType getClickType() const;
 
-    /// Whether a button that is held for the long click span clicks by itself, the mouse still down; on by default.
+    /// Whether a button that is held for the long click span clicks by itself, the mouse still down; on by
+    /// default.
     bool autoClick() const;
     void setAutoClick(bool on);
 

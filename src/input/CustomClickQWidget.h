@@ -10,11 +10,11 @@ class QMouseEvent;
 
 namespace vx
 {
-/// A widget that offers the signals of a button without being one, for code that wants something to click. It paints
-/// nothing, has no state, and any mouse button clicks it.
+/// A widget that offers the signals of a button without being one, for code that wants something to click. It
+/// paints nothing, has no state, and any mouse button clicks it.
 ///
-/// A press gives pressed(); a release gives clicked(false), if there was a press, and then released(), wherever the
-/// pointer is. Mouse events do not go on to the parent.
+/// A press gives pressed(); a release gives clicked(false), if there was a press, and then released(), wherever
+/// the pointer is. Mouse events do not go on to the parent.
 class ZELKOV_WIDGETS_EXPORT CustomClickQWidget : public QWidget
 {
     Q_OBJECT
@@ -24,8 +24,8 @@ public:
     ~CustomClickQWidget() override;
 
 Q_SIGNALS:
-    /// A release after a press, or a call of click() or the other clicked(). \a checked is always false. To connect
-    /// by address, pick it with QOverload<bool>::of().
+    /// A release after a press, or a call of click() or the other clicked(). \a checked is always false. To
+    /// connect by address, pick it with QOverload<bool>::of().
     void clicked(bool checked);
     void pressed();
     void released();

@@ -12,8 +12,8 @@ namespace vx
 /// The click button with the arrow of a split tool button (QToolButton::MenuButtonPopup). A click on the arrow is
 /// clicked() with the click type ectArrow: the button opens nothing itself, the slot opens what it wants.
 ///
-/// The arrow emits on the release within it, has no hold timer, does not push the button down and asks for no right:
-/// what it opens is guarded by what is in there.
+/// The arrow emits on the release within it, has no hold timer, does not push the button down and asks for no
+/// right: what it opens is guarded by what is in there.
 class ZELKOV_WIDGETS_EXPORT CustomContextClickToolButton : public TCustomClickWidget<QToolButton>
 {
     Q_OBJECT

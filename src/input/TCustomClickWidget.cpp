@@ -20,7 +20,7 @@ constexpr int c_FadingMaxAlpha = 128;
 template <typename T>
 TCustomClickWidget<T>::TCustomClickWidget(QWidget* parent, int longClickSpan, bool shadow)
     : TFadingWidget<T>(parent, c_FadingInterval, c_FadingStep, QColor(191, 191, 191, 255), c_FadingMinAlpha,
-          c_FadingMaxAlpha, false)
+        c_FadingMaxAlpha, false)
     , CustomClickAdapter(this, longClickSpan)
 {
     this->setFocusPolicy(Qt::NoFocus);
@@ -28,17 +28,14 @@ TCustomClickWidget<T>::TCustomClickWidget(QWidget* parent, int longClickSpan, bo
     this->enableShadow(shadow);
 }
 
-template <typename T>
-TCustomClickWidget<T>::~TCustomClickWidget() = default;
+template <typename T> TCustomClickWidget<T>::~TCustomClickWidget() = default;
 
-template <typename T>
-void TCustomClickWidget<T>::setListener(QObject* listener)
+template <typename T> void TCustomClickWidget<T>::setListener(QObject* listener)
 {
     m_listener = listener;
 }
 
-template <typename T>
-void TCustomClickWidget<T>::mousePressEvent(QMouseEvent* event)
+template <typename T> void TCustomClickWidget<T>::mousePressEvent(QMouseEvent* event)
 {
     if (isProtected()) {
         return;
@@ -57,8 +54,7 @@ void TCustomClickWidget<T>::mousePressEvent(QMouseEvent* event)
     T::mousePressEvent(event);
 }
 
-template <typename T>
-void TCustomClickWidget<T>::mouseReleaseEvent(QMouseEvent* event)
+template <typename T> void TCustomClickWidget<T>::mouseReleaseEvent(QMouseEvent* event)
 {
     stopClickTimer();
     if (m_protected) {
@@ -73,8 +69,7 @@ void TCustomClickWidget<T>::mouseReleaseEvent(QMouseEvent* event)
     }
 }
 
-template <typename T>
-void TCustomClickWidget<T>::mouseMoveEvent(QMouseEvent* event)
+template <typename T> void TCustomClickWidget<T>::mouseMoveEvent(QMouseEvent* event)
 {
     // After the automatic click a move would push the button down again, and its release would click once more.
     if (m_longClickTimer.isActive()) {
@@ -82,8 +77,7 @@ void TCustomClickWidget<T>::mouseMoveEvent(QMouseEvent* event)
     }
 }
 
-template <typename T>
-void TCustomClickWidget<T>::contextMenuEvent(QContextMenuEvent* /*event*/)
+template <typename T> void TCustomClickWidget<T>::contextMenuEvent(QContextMenuEvent* /*event*/)
 {
     if (isProtected()) {
         return;
@@ -93,33 +87,28 @@ void TCustomClickWidget<T>::contextMenuEvent(QContextMenuEvent* /*event*/)
     Q_EMIT this->clicked(false);
 }
 
-template <typename T>
-void TCustomClickWidget<T>::enterEvent(QEvent* event)
+template <typename T> void TCustomClickWidget<T>::enterEvent(QEvent* event)
 {
     T::enterEvent(event);
 }
 
-template <typename T>
-void TCustomClickWidget<T>::leaveEvent(QEvent* event)
+template <typename T> void TCustomClickWidget<T>::leaveEvent(QEvent* event)
 {
     m_longClickTimer.stop();
     T::leaveEvent(event);
 }
 
-template <typename T>
-void TCustomClickWidget<T>::changeEvent(QEvent* event)
+template <typename T> void TCustomClickWidget<T>::changeEvent(QEvent* event)
 {
     T::changeEvent(event);
 }
 
-template <typename T>
-void TCustomClickWidget<T>::checkStateSet()
+template <typename T> void TCustomClickWidget<T>::checkStateSet()
 {
     T::checkStateSet();
 }
 
-template <typename T>
-void TCustomClickWidget<T>::nextCheckState()
+template <typename T> void TCustomClickWidget<T>::nextCheckState()
 {
     stopClickTimer();
     if (isProtected()) {

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The push button that shortens its text, compared with push buttons that have the text it should show.
+#include "indicators/ElidedButton.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "indicators/ElidedButton.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QMenu>

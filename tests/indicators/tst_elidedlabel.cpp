@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The label that shortens its text, compared with widgets that draw the text that it should show.
+#include "indicators/ElidedLabel.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "indicators/ElidedLabel.h"
 
 #include <QtGui/QPainter>
 #include <QtTest/QtTest>
@@ -94,8 +94,8 @@ private Q_SLOTS:
         QTest::addColumn<int>("indent");
         const QVector<QPair<const char*, int>> across = {{"left", Qt::AlignLeft}, {"right", Qt::AlignRight},
             {"centre", Qt::AlignHCenter}, {"justify", Qt::AlignJustify}};
-        const QVector<QPair<const char*, int>> down = {{"top", Qt::AlignTop}, {"bottom", Qt::AlignBottom},
-            {"centre", Qt::AlignVCenter}};
+        const QVector<QPair<const char*, int>> down
+            = {{"top", Qt::AlignTop}, {"bottom", Qt::AlignBottom}, {"centre", Qt::AlignVCenter}};
         const QVector<QPair<const char*, int>> modes = {{"left", Qt::ElideLeft}, {"right", Qt::ElideRight},
             {"middle", Qt::ElideMiddle}, {"none", Qt::ElideNone}};
         for (const auto& mode : modes) {
@@ -170,7 +170,8 @@ private Q_SLOTS:
         label.resize(width, 60);
         QVERIFY(shows(label, label.rect(), int(label.alignment()), QStringLiteral("Two words")));
         label.resize(width - 1, 60);
-        QVERIFY(shows(label, label.rect(), int(label.alignment()) | Qt::TextWordWrap, QStringLiteral("Two words")));
+        QVERIFY(
+            shows(label, label.rect(), int(label.alignment()) | Qt::TextWordWrap, QStringLiteral("Two words")));
     }
 
     void onlyTheWordThatIsTooLongIsElided_data()
@@ -260,8 +261,8 @@ private Q_SLOTS:
         QGuiApplication::setLayoutDirection(Qt::RightToLeft);
         vx::ElidedLabel label(QStringLiteral("Short"));
         label.resize(120, 24);
-        const bool mirrored = shows(label, label.rect(), int(Qt::AlignRight | Qt::AlignVCenter | Qt::AlignAbsolute),
-            QStringLiteral("Short"));
+        const bool mirrored = shows(label, label.rect(),
+            int(Qt::AlignRight | Qt::AlignVCenter | Qt::AlignAbsolute), QStringLiteral("Short"));
         QGuiApplication::setLayoutDirection(Qt::LeftToRight);
         QVERIFY(mirrored);
         // The direction of the label alone does not.

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The label whose scaled picture keeps its proportions, compared pixel by pixel.
+#include "indicators/Label.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "indicators/Label.h"
 
 #include <QtGui/QPainter>
 #include <QtTest/QtTest>
@@ -179,7 +179,8 @@ private Q_SLOTS:
         furnish(label, stripes(200, 100), QSize(100, 100));
         const QImage image = frame(label);
         QCOMPARE(style.calls,
-            QStringList({QStringLiteral("pixmap 200x100 at %1").arg(int(Qt::AlignCenter)), QStringLiteral("widget")}));
+            QStringList(
+                {QStringLiteral("pixmap 200x100 at %1").arg(int(Qt::AlignCenter)), QStringLiteral("widget")}));
         QCOMPARE(image.pixelColor(1, 1), QColor(Qt::black));
         label.setEnabled(false);
         QCOMPARE(frame(label).pixelColor(1, 1), QColor(Qt::white));

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Where text and pictures of labels go, without a widget.
+#include "indicators/LabelGeometry.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "indicators/LabelGeometry.h"
 
 #include <QtCore/QRandomGenerator>
 #include <QtTest/QtTest>
@@ -46,7 +46,8 @@ private Q_SLOTS:
     void anIndentBeyondAllMeasureIsHarmless()
     {
         for (const int indent : {INT_MIN, INT_MAX}) {
-            for (const Qt::Alignment alignment : {Qt::AlignLeft | Qt::AlignTop, Qt::AlignRight | Qt::AlignBottom}) {
+            for (const Qt::Alignment alignment :
+                {Qt::AlignLeft | Qt::AlignTop, Qt::AlignRight | Qt::AlignBottom}) {
                 const QRect rect = indented(QRect(0, 0, 100, 50), alignment, indent);
                 QCOMPARE(rect.isEmpty(), indent > 0);
             }
@@ -76,8 +77,8 @@ private Q_SLOTS:
     {
         QRandomGenerator random(7);
         for (int i = 0; i < 20000; ++i) {
-            const QRect frame(random.bounded(-50, 50), random.bounded(-50, 50), random.bounded(1, 300),
-                random.bounded(1, 300));
+            const QRect frame(
+                random.bounded(-50, 50), random.bounded(-50, 50), random.bounded(1, 300), random.bounded(1, 300));
             const QSize source(random.bounded(1, 300), random.bounded(1, 300));
             const QSize picture = source.scaled(frame.size(), Qt::KeepAspectRatioByExpanding);
             const QRect placed(coverOrigin(frame, picture), picture);

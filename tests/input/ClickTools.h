@@ -2,8 +2,8 @@
 // What the tests of click buttons share: a security manager that writes down what it is asked, and a listener.
 #pragma once
 
-#include "ZelkovUtils/ISecurityManager.h"
 #include "input/CustomClickAdapter.h"
+#include "ZelkovUtils/ISecurityManager.h"
 
 #include <QtCore/QElapsedTimer>
 #include <QtCore/QStringList>
@@ -82,7 +82,8 @@ inline void rightClick(QWidget* widget, const QPoint& position)
 }
 
 /// Sends a mouse event straight to the widget and says whether it was accepted there.
-inline bool mouse(QWidget* widget, QEvent::Type type, const QPoint& position, Qt::MouseButton button = Qt::LeftButton)
+inline bool mouse(
+    QWidget* widget, QEvent::Type type, const QPoint& position, Qt::MouseButton button = Qt::LeftButton)
 {
     const bool isRelease = type == QEvent::MouseButtonRelease;
     const bool isMove = type == QEvent::MouseMove;

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // The mix-in alone: the verdict on a hold, its timer, and the questions to the security manager.
 #include "ClickTools.h"
+#include "input/ClickVerdict.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "input/ClickVerdict.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QWidget>

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The widget with the signals of a button: their order, any mouse button, and the hooks for subclasses.
 #include "ClickTools.h"
-#include "TestCase.h"
-#include "TestMain.h"
 #include "input/CustomClickQWidget.h"
 #include "support/Pointer.h"
 #include "support/SignalRecorder.h"
+#include "TestCase.h"
+#include "TestMain.h"
 
 #include <QtCore/QMetaMethod>
 #include <QtTest/QtTest>
@@ -62,7 +62,7 @@ private Q_SLOTS:
         }
         QCOMPARE(methods, words({"clicked(bool)", "pressed()", "released()", "toggled(bool)", "click()"}));
         QCOMPARE(meta.method(meta.methodCount() - 1).access(), QMetaMethod::Protected);
-        QCOMPARE(meta.method(meta.methodOffset()).parameterNames(), QList<QByteArray>{"checked"});
+        QCOMPARE(meta.method(meta.methodOffset()).parameterNames(), QList<QByteArray> {"checked"});
     }
 
     void aClickIsPressedThenClickedThenReleased_data()
@@ -91,7 +91,7 @@ private Q_SLOTS:
         pointer.release(mouseButton);
         QCoreApplication::processEvents();
         QCOMPARE(recorder.names(), words({"pressed", "clicked", "released"}));
-        QCOMPARE(recorder.entries().at(1).arguments, QVariantList{false});
+        QCOMPARE(recorder.entries().at(1).arguments, QVariantList {false});
     }
 
     void aReleaseOutsideClicksToo()
@@ -131,7 +131,7 @@ private Q_SLOTS:
         QVERIFY(QMetaObject::invokeMethod(&widget, "click"));
         QCOMPARE(recorder.names(), words({"clicked", "clicked", "clicked"}));
         for (const auto& entry : recorder.entries()) {
-            QCOMPARE(entry.arguments, QVariantList{false});
+            QCOMPARE(entry.arguments, QVariantList {false});
         }
     }
 
@@ -164,7 +164,8 @@ private Q_SLOTS:
         QVERIFY(connect(m_victim, signal.constData(), this, SLOT(kill())));
         mouse(m_victim, QEvent::MouseButtonPress, QPoint(5, 5));
         if (m_victim != nullptr) {
-            QMouseEvent release(QEvent::MouseButtonRelease, QPoint(5, 5), Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
+            QMouseEvent release(
+                QEvent::MouseButtonRelease, QPoint(5, 5), Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
             QApplication::sendEvent(m_victim, &release);
         }
         QVERIFY(m_victim == nullptr);

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 // The split button: where the arrow is, and what a click on it does and does not do.
 #include "ClickTools.h"
-#include "TestCase.h"
-#include "TestMain.h"
 #include "input/CustomContextClickToolButton.h"
 #include "support/Pointer.h"
+#include "TestCase.h"
+#include "TestMain.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QMenu>
@@ -98,9 +98,8 @@ private Q_SLOTS:
         QStringList emitted;
         connect(button, &QToolButton::pressed, &host, [&] { emitted << QStringLiteral("pressed"); });
         connect(button, &QToolButton::released, &host, [&] { emitted << QStringLiteral("released"); });
-        connect(button, &QToolButton::clicked, &host, [&](bool on) {
-            emitted << QStringLiteral("clicked %1 %2").arg(int(button->getClickType())).arg(on);
-        });
+        connect(button, &QToolButton::clicked, &host,
+            [&](bool on) { emitted << QStringLiteral("clicked %1 %2").arg(int(button->getClickType())).arg(on); });
         zelkovtest::Pointer pointer(&host);
         pointer.move(button->geometry().topLeft() + button->arrow().center());
         pointer.press();
@@ -124,7 +123,7 @@ private Q_SLOTS:
         // The plain widget ignores both events, so they go on to the parent.
         QVERIFY(!mouse(&button, QEvent::MouseButtonPress, button.arrow().center()));
         QVERIFY(!mouse(&button, QEvent::MouseButtonRelease, button.arrow().center()));
-        QCOMPARE(clicked, (QList<QVariantList>{{false}}));
+        QCOMPARE(clicked, (QList<QVariantList> {{false}}));
         QVERIFY(button.isChecked());
     }
 
@@ -200,8 +199,8 @@ private Q_SLOTS:
         QPointer<SplitButton> button = new SplitButton;
         connect(button, &QToolButton::clicked, this, [&] { delete button.data(); });
         mouse(button, QEvent::MouseButtonPress, button->arrow().center());
-        QMouseEvent release(QEvent::MouseButtonRelease, button->arrow().center(), Qt::LeftButton, Qt::NoButton,
-            Qt::NoModifier);
+        QMouseEvent release(
+            QEvent::MouseButtonRelease, button->arrow().center(), Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
         QApplication::sendEvent(button, &release);
         QVERIFY(button == nullptr);
     }

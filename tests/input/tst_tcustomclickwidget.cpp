@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The click button with a real pointer: short, long, automatic and context clicks, rights, and the listener.
 #include "ClickTools.h"
-#include "TestCase.h"
-#include "TestMain.h"
 #include "input/TCustomClickWidget.h"
 #include "support/LogCapture.h"
 #include "support/Pointer.h"
+#include "TestCase.h"
+#include "TestMain.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QAction>
@@ -116,8 +116,11 @@ public:
 public Q_SLOTS:
     void mousePress(QMouseEvent* event, T* button)
     {
-        seen << QStringLiteral("press %1,%2 type %3 held %4").arg(event->x()).arg(event->y())
-                    .arg(int(expected->getClickType())).arg(expected->holds());
+        seen << QStringLiteral("press %1,%2 type %3 held %4")
+                    .arg(event->x())
+                    .arg(event->y())
+                    .arg(int(expected->getClickType()))
+                    .arg(expected->holds());
         same = same && button == expected;
         if (whenPressed) {
             whenPressed();
@@ -125,7 +128,9 @@ public Q_SLOTS:
     }
     void mouseRelease(QMouseEvent* event, T* button)
     {
-        seen << QStringLiteral("release %1,%2 type %3").arg(event->x()).arg(event->y())
+        seen << QStringLiteral("release %1,%2 type %3")
+                    .arg(event->x())
+                    .arg(event->y())
                     .arg(int(expected->getClickType()));
         same = same && button == expected;
     }
@@ -286,8 +291,9 @@ private Q_SLOTS:
         QVERIFY(clicked.wait());
         scene.release();
         QCOMPARE(scene.button->isChecked(), on);
-        QCOMPARE(scene.take(), on ? words({"pressed 1", "pressed 1", "toggled on 2", "released 2", "clicked on 2"})
-                                  : words({"pressed 1", "pressed 1", "toggled off 2", "released 2", "clicked 2"}));
+        QCOMPARE(scene.take(),
+            on ? words({"pressed 1", "pressed 1", "toggled on 2", "released 2", "clicked on 2"})
+               : words({"pressed 1", "pressed 1", "toggled off 2", "released 2", "clicked 2"}));
     }
 
     void aShortClickOnACheckableButtonFlipsIt()
@@ -308,7 +314,7 @@ private Q_SLOTS:
         button.click();
         QCOMPARE(button.getClickType(), CustomClickAdapter::ectLong);
         QVERIFY(!button.isChecked());
-        QCOMPARE(toggled, (QList<QVariantList>{{false}}));
+        QCOMPARE(toggled, (QList<QVariantList> {{false}}));
         Button manual;
         manual.setCheckable(true);
         manual.setAutoClick(false);
@@ -415,12 +421,14 @@ private Q_SLOTS:
         Listener listener;
         listener.expected = scene.button;
         scene.button->setListener(&listener);
-        connect(scene.button, &QToolButton::pressed, &listener, [&] { listener.seen << QStringLiteral("pressed"); });
-        connect(scene.button, &QToolButton::clicked, &listener, [&] { listener.seen << QStringLiteral("clicked"); });
+        connect(
+            scene.button, &QToolButton::pressed, &listener, [&] { listener.seen << QStringLiteral("pressed"); });
+        connect(
+            scene.button, &QToolButton::clicked, &listener, [&] { listener.seen << QStringLiteral("clicked"); });
         scene.pressInside();
         scene.release();
-        QCOMPARE(listener.seen,
-            words({"press 20,20 type 0 held 0", "pressed", "clicked", "release 20,20 type 1"}));
+        QCOMPARE(
+            listener.seen, words({"press 20,20 type 0 held 0", "pressed", "clicked", "release 20,20 type 1"}));
         QVERIFY(listener.same);
         listener.seen.clear();
         scene.button->setListener(nullptr);
@@ -470,7 +478,8 @@ private Q_SLOTS:
     void whoeverIsAskedOrToldMayDeleteTheButton_data()
     {
         QTest::addColumn<QString>("who");
-        for (const char* who : {"listener", "manager", "pressed", "released", "clicked", "long toggled", "long clicked", "context"}) {
+        for (const char* who :
+            {"listener", "manager", "pressed", "released", "clicked", "long toggled", "long clicked", "context"}) {
             QTest::newRow(who) << QString::fromLatin1(who);
         }
     }

@@ -60,7 +60,7 @@ template <class Button> Entry clickButton(const char* name, const char* header)
         button->setPopupMode(QToolButton::MenuButtonPopup);
         button->setCheckable(true);
         button->resize(80, 30);
-        return Subject{button, button};
+        return Subject {button, button};
     };
     entry.exercise = {
         {"click and leave", {"pressed", "released", "clicked"},
@@ -102,7 +102,7 @@ Entry clickableWidget()
     entry.create = [](QWidget* host) {
         auto* const widget = new SwitchingWidget(host);
         widget->resize(80, 30);
-        return Subject{widget, widget};
+        return Subject {widget, widget};
     };
     entry.exercise = {{"click", {"pressed", "clicked", "released", "toggled"},
         {mousePress(c_middle, 0), mouseMove(c_middle, 5), mouseRelease(c_middle, 10)}}};

@@ -33,19 +33,19 @@ Entry pictureLabel()
         label->setPixmap(picture);
         label->setScaledContents(true);
         label->resize(80, 80);
-        return Subject{label, label};
+        return Subject {label, label};
     };
     entry.exercise = {{"other picture, other size", {}, {[](const Subject& subject) {
-        auto* const label = static_cast<Label*>(subject.object.data());
-        paint(label);
-        label->setPixmap(QPixmap());
-        paint(label);
-        QPixmap picture(20, 60);
-        picture.fill(Qt::blue);
-        label->setPixmap(picture);
-        label->resize(90, 40);
-        paint(label);
-    }}}};
+                           auto* const label = static_cast<Label*>(subject.object.data());
+                           paint(label);
+                           label->setPixmap(QPixmap());
+                           paint(label);
+                           QPixmap picture(20, 60);
+                           picture.fill(Qt::blue);
+                           label->setPixmap(picture);
+                           label->resize(90, 40);
+                           paint(label);
+                       }}}};
     entry.setters = {
         setter("setKeepAspectRatio", &Label::setKeepAspectRatio),
         setter("setPixmap", &Label::setPixmap),
@@ -62,16 +62,16 @@ Entry elidedLabel()
     entry.create = [](QWidget* host) {
         ElidedLabel* const label = new ElidedLabel(longText(), host);
         label->resize(100, 60);
-        return Subject{label, label};
+        return Subject {label, label};
     };
     entry.exercise = {{"wrap", {}, {[](const Subject& subject) {
-        auto* const label = static_cast<ElidedLabel*>(subject.object.data());
-        paint(label);
-        label->setWordWrap(true);
-        paint(label);
-        label->resize(30, 60);
-        paint(label);
-    }}}};
+                           auto* const label = static_cast<ElidedLabel*>(subject.object.data());
+                           paint(label);
+                           label->setWordWrap(true);
+                           paint(label);
+                           label->resize(30, 60);
+                           paint(label);
+                       }}}};
     entry.setters = {
         setter("setElideMode", &ElidedLabel::setElideMode),
         setter("setText", &QLabel::setText),
@@ -90,15 +90,16 @@ Entry elidedButton()
     entry.create = [](QWidget* host) {
         ElidedButton* const button = new ElidedButton(longText(), host);
         button->resize(100, 30);
-        return Subject{button, button};
+        return Subject {button, button};
     };
-    entry.exercise = {{"modes", {}, {[](const Subject& subject) {
-        auto* const button = static_cast<ElidedButton*>(subject.object.data());
-        for (const Qt::TextElideMode mode : {Qt::ElideLeft, Qt::ElideMiddle, Qt::ElideRight, Qt::ElideNone}) {
-            button->setElideMode(mode);
-            paint(button);
-        }
-    }}}};
+    entry.exercise = {
+        {"modes", {}, {[](const Subject& subject) {
+             auto* const button = static_cast<ElidedButton*>(subject.object.data());
+             for (const Qt::TextElideMode mode : {Qt::ElideLeft, Qt::ElideMiddle, Qt::ElideRight, Qt::ElideNone}) {
+                 button->setElideMode(mode);
+                 paint(button);
+             }
+         }}}};
     entry.setters = {
         setter("setElideMode", &ElidedButton::setElideMode),
         setter("setText", &QAbstractButton::setText),
