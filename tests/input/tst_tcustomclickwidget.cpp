@@ -477,9 +477,9 @@ private Q_SLOTS:
 
     void whoeverIsAskedOrToldMayDeleteTheButton_data()
     {
+        // But not the slots that a release calls: QToolButton itself writes to the button after them.
         QTest::addColumn<QString>("who");
-        for (const char* who :
-            {"listener", "manager", "pressed", "released", "clicked", "long toggled", "long clicked", "context"}) {
+        for (const char* who : {"listener", "manager", "pressed", "long toggled", "long clicked", "context"}) {
             QTest::newRow(who) << QString::fromLatin1(who);
         }
     }
@@ -503,8 +503,6 @@ private Q_SLOTS:
             guard->whenAsked = kill;
         } else if (who == QLatin1String("pressed")) {
             connect(scene.button, &QToolButton::pressed, &listener, kill);
-        } else if (who == QLatin1String("released")) {
-            connect(scene.button, &QToolButton::released, &listener, kill);
         } else if (who == QLatin1String("long toggled")) {
             connect(scene.button, &QToolButton::toggled, &listener, kill);
         } else {
