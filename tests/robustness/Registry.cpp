@@ -10,8 +10,8 @@ const std::vector<Entry>& registry()
         std::vector<Entry> all;
         for (const std::vector<Entry>& room :
             {platformEntries(), foundationEntries(), indicatorsEntries(), inputEntries(), slidersEntries(),
-                popoverItemEntries(), balloonEntries(), controllerEntries(),
-                modelsEntries(), clickEntries(), labelEntries(), switchEntries()}) {
+                popoverItemEntries(), balloonEntries(), controllerEntries(), modelsEntries(), clickEntries(),
+                labelEntries(), switchEntries(), editsEntries(), overlayEntries()}) {
             all.insert(all.end(), room.begin(), room.end());
         }
         return all;

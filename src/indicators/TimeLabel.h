@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: MIT
+// The overlay that tells when and where the frame of a picture was taken.
+#pragma once
+
+#include "foundation/Export.h"
+
+#include <QtCore/QDateTime>
+#include <QtCore/QPoint>
+#include <QtCore/QString>
+#include <QtWidgets/QWidget>
+
+class QLabel;
+
+namespace vx
+{
+class ClickHelper;
+class DateTimeEdit;
+
+/// The overlay on a live or recorded picture: a symbol that tells where the picture comes from, the date and time of
+/// the frame, which can be edited, and how far it lies from an anchor time. Its font is the largest that fits into the
+/// parent's width and the given height.
+///
+/// Frame times and anchor times are microseconds since the epoch, and all bits set means no time; without a time and
+/// without a text to show in its place the label collapses to height 0. It does not place itself: put it where the
+/// properties "overlaypos" and "overlaymargin" say on reposTimeLabel(), and move it on the mouse moves that it ignores
+/// between labelGrabbed(true) and labelGrabbed(false).
+///
+/// Object names for style sheets: "FrameTimeWidget", "FrameTimeLabel" and "DateEdit"; the symbol's is its state, by
+/// which the style sheet chooses the picture: "FrameTimeGrabberCamera", "FrameTimeGrabberFileserver" or
+/// "FrameTimeGrabberError".
+class ZELKOV_WIDGETS_EXPORT TimeLabel : public QWidget
+{
+    Q_OBJECT
+
+public:
+    /// Starts hidden. \a recording true chooses the camera's symbol, false the file server's.
+    explicit TimeLabel(bool recording, QWidget* parent = nullptr);
+    ~TimeLabel() override;
+
+    /// Shows or hides the label. \a maxHeight is the largest height of a line in pixels, \a margin goes to the
+    /// property "overlaymargin" and \a position to "overlaypos". With \a forceShow a frame without time shows dashes.
+    /// The height is 0 until the next refresh; the frame time that is shown already gives none.
+    void showFrametime(bool show, quint64 frameTime, int maxHeight, int margin, bool readOnly, Qt::Alignment position,
+        bool forceShow);
+    /// Fits everything anew, for instance after a resize of the parent. Emits reposTimeLabel(false) if \a reposition.
+    void resizeContent(bool reposition);
+    /// A text in place of the difference, until there is a frame time again.
+    void setErrorText(const QString& text);
+    /// The error symbol outranks the other two.
+    void showErrorSymbol(bool on);
+    void changeRecordingSymbol(bool on);
+    void setForceShow(bool on);
+    /// Whether the time can be edited.
+    void setReadOnly(bool readOnly);
+    /// For events that reached the overlay in place of the edit: sent to the edit, ignored while it is read-only.
+    void handleEvents(QEvent* event);
+    DateTimeEdit* getDateTimeEit() const; //!< spelled so: clients rely on it
+
+public Q_SLOTS:
+    void setFrametime(qulonglong time);
+    void setAnchortime(qulonglong time);
+
+Q_SIGNALS:
+    /// Place the label: true puts it back to its configured place (after a double click), false keeps the place it has
+    /// been moved to (its size may have changed).
+    void reposTimeLabel(bool);
+    /// The user entered another time.
+    void frametimeUpdate(QDateTime);
+    /// Pressed (true) and released (false).
+    void labelGrabbed(bool);
+    /// Clicked without having been moved.
+    void symbolClicked();
+
+protected:
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+
+private Q_SLOTS:
+    void frameTimeChanged();
+    void onClick();
+    void onDoubleClick();
+
+private:
+    void refresh(bool reposition);
+    void calcTimeDiffs();
+    void calcSizes();
+    void arrangeWidgets();
+    void nameSymbol(const QString& name);
+
+    QPoint m_pressPos; // own coordinates
+    int m_maxHeight = 0;
+    int m_lineHeight = 0;
+    int m_fontPointSize = 0;
+    int m_overlayPos;
+    quint64 m_anchorTime;
+    quint64 m_frameTime;
+    QLabel* m_symbolLabel = nullptr;
+    QLabel* m_timeDiffLabel = nullptr;
+    DateTimeEdit* m_dateTimeEdit = nullptr;
+    bool m_pressed = false;
+    bool m_moved = false;
+    bool m_forceShow = false;
+    bool m_recording;
+    bool m_errorSymbol = false;
+    ClickHelper* m_clickHelper = nullptr;
+    QString m_errorText;
+};
+}
