@@ -92,6 +92,8 @@ Entry searchEdit()
 Entry joystickView()
 {
     Entry entry = widgetClass<JoystickViewWidget>("JoystickViewWidget", "controls/JoystickViewWidget.h");
+    entry.exercise = {{"steer", {},
+        {call(&JoystickViewWidget::setPointPosition, 0.5F, 0.5F), call(&JoystickViewWidget::setRotationAngle, 30)}}};
     entry.setters = {
         setter("setPointPosition", &JoystickViewWidget::setPointPosition),
         setter("setCircleInset", &JoystickViewWidget::setCircleInset),
@@ -104,6 +106,8 @@ Entry countingLines()
 {
     Entry entry
         = widgetClass<vx::VxCountingLinesGroupBox>("VxCountingLinesGroupBox", "controls/VxCountingLinesGroupBox.h");
+    entry.exercise = {{"fill in", {},
+        {call(&vx::VxCountingLinesGroupBox::setId, 3), call(&vx::VxCountingLinesGroupBox::setRange, QRect(0, 0, 9, 9))}}};
     entry.setters = {
         setter("setStartingPoint", &vx::VxCountingLinesGroupBox::setStartingPoint),
         setter("setEndPoint", &vx::VxCountingLinesGroupBox::setEndPoint),
@@ -117,6 +121,7 @@ Entry countingLines()
 std::vector<Entry> editsEntries()
 {
     Entry combo = widgetClass<vx::ExtendedComboBox>("ExtendedComboBox", "controls/ExtendedComboBox.h");
+    combo.exercise = {{"press beside it", {}, {mouseMove(QPoint(3, 3), 0, Qt::NoButton), leave()}}};
     combo.setters = {setter("setIgnoreWheelEvents", &vx::ExtendedComboBox::setIgnoreWheelEvents)};
     return {
         dateTimeDefaultEdit(),

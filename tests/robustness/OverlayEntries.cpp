@@ -7,6 +7,7 @@
 #include "indicators/NameTimeLabel.h"
 #include "indicators/TimeLabel.h"
 
+#include <QtCore/QCoreApplication>
 #include <QtGui/QKeyEvent>
 #include <QtWidgets/QLabel>
 
