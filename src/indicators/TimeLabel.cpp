@@ -61,7 +61,15 @@ TimeLabel::TimeLabel(bool recording, QWidget* parent)
     vx::connect(m_clickHelper, "2doubleClicked(const QPointF&)", this, "1onDoubleClick()", Qt::AutoConnection);
 }
 
-TimeLabel::~TimeLabel() = default;
+TimeLabel::~TimeLabel()
+{
+    if (m_rescuedEdit) {
+        m_dateTimeEdit->disconnect(this);
+        m_dateTimeEdit->hide();
+        m_dateTimeEdit->setParent(nullptr);
+        *m_rescuedEdit = m_dateTimeEdit;
+    }
+}
 
 void TimeLabel::showFrametime(bool show, quint64 frameTime, int maxHeight, int margin, bool readOnly,
     Qt::Alignment position, bool forceShow)
@@ -218,7 +226,20 @@ void TimeLabel::frameTimeChanged()
     }
     const QDateTime time = m_dateTimeEdit->dateTime();
     m_frameTime = static_cast<quint64>(secondsOfTime(time)) * 1000000;
+    // The edit is in the middle of a key event and goes on with it after this: it has to outlive a label that is
+    // deleted by a slot.
+    DateTimeEdit* rescued = nullptr;
+    DateTimeEdit** const outer = m_rescuedEdit;
+    const QPointer<TimeLabel> alive(this);
+    if (!outer) {
+        m_rescuedEdit = &rescued;
+    }
     Q_EMIT frametimeUpdate(time);
+    if (alive) {
+        m_rescuedEdit = outer;
+    } else if (rescued) {
+        rescued->deleteLater();
+    }
 }
 
 void TimeLabel::handleEvents(QEvent* event)

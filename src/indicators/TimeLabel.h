@@ -106,5 +106,6 @@ private:
     bool m_errorSymbol = false;
     ClickHelper* m_clickHelper = nullptr;
     QString m_errorText;
+    DateTimeEdit** m_rescuedEdit = nullptr; // where the destructor leaves the edit that is in its own signal
 };
 }

@@ -42,7 +42,10 @@ Entry dateTimeDefaultEdit()
         {"press", {"anchorTimeClicked"}, {mousePress(QPoint(3, 3), 0), mouseRelease(QPoint(3, 3), 10)}},
         {"back to the default", {},
             {call(&vx::DateTimeDefaultEdit::setDefaultDateTime, QDateTime(QDate(2024, 1, 2), QTime(3, 4))),
-                call(&QDateTimeEdit::setDateTime, QDateTime(QDate(2025, 1, 2), QTime(3, 4))), pressTheButton()}}};
+                call(&QDateTimeEdit::setDateTime, QDateTime(QDate(2025, 1, 2), QTime(3, 4))), pressTheButton()}},
+        // Only clients emit this one.
+        {"a client's own way back", {"resettedToDefault"},
+            {call(&vx::DateTimeDefaultEdit::resettedToDefault, QDateTime(QDate(2024, 1, 2), QTime(3, 4)))}}};
     return entry;
 }
 
