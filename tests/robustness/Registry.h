@@ -84,6 +84,7 @@ std::vector<Entry> balloonEntries();
 std::vector<Entry> slidersEntries();
 std::vector<Entry> popoverItemEntries();
 std::vector<Entry> modelsEntries();
+std::vector<Entry> viewsEntries();
 std::vector<Entry> editsEntries();
 std::vector<Entry> overlayEntries();
 std::vector<Entry> switchEntries();
