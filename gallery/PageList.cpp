@@ -11,6 +11,7 @@
 #include "pages/DeviceBrowserPage.h"
 #include "pages/LabelsPage.h"
 #include "pages/MouseGesturesPage.h"
+#include "pages/PopoversPage.h"
 #include "pages/ScrollBarsPage.h"
 
 namespace gallery
@@ -74,6 +75,12 @@ const QVector<PageEntry>& pages()
                            "NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows "
                            "a click on its groove at once."),
          &make<ScrollBarsPage>},
+        {"popovers", QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "A popover points at what it belongs to, keeps inside the window and closes with a click "
+                           "beside it. Click a number."),
+         &make<PopoversPage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

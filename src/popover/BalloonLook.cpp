@@ -8,6 +8,9 @@ namespace PopoverWidget
 {
 namespace
 {
+constexpr qreal c_LeastContrast = 0.55; // of lightness
+constexpr qreal c_BorderShare = 0.4; // of the words' colour
+
 QColor balloonMix(const QColor& a, const QColor& b, qreal share)
 {
     return QColor::fromRgbF(a.redF() + (b.redF() - a.redF()) * share,
@@ -27,13 +30,15 @@ BalloonLook BalloonLook::resolved(
         }
         return look;
     }
-    const QColor window = palette.color(QPalette::Window);
+    // Elements of rows fill their ground with the colour of buttons, so that is the body's, unless words would be
+    // hard to read on it.
     const QColor text = palette.color(QPalette::WindowText);
-    const bool dark = window.lightnessF() < text.lightnessF();
-    look.upper = balloonMix(window, Qt::white, dark ? 0.09 : 0.7);
-    look.lower = balloonMix(window, Qt::white, dark ? 0.05 : 0.45);
+    const QColor button = palette.color(QPalette::Button);
+    const bool readable = qAbs(button.lightnessF() - text.lightnessF()) >= c_LeastContrast;
+    look.upper = readable ? button : palette.color(QPalette::Window);
+    look.lower = look.upper;
     if (!border.isValid()) {
-        look.border = balloonMix(window, text, dark ? 0.4 : 0.35);
+        look.border = balloonMix(look.upper, text, c_BorderShare);
     }
     return look;
 }

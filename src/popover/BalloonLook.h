@@ -15,8 +15,8 @@ namespace PopoverWidget
 struct ZELKOV_WIDGETS_EXPORT BalloonLook
 {
     /// The look for these colours of a balloon, each of which may be invalid. One body colour stands in for the
-    /// other; with neither, the body stands out a little from the palette's windows, and with no colour at all it
-    /// has a border that is seen on light and on dark windows.
+    /// other; with neither, the body has the colour of the palette's buttons (of its windows, if words would be hard
+    /// to read), and with no colour at all a border that is seen on light and on dark windows.
     static BalloonLook resolved(const QColor& background, const QColor& background2, const QColor& border,
         const QPalette& palette);
 

@@ -170,6 +170,9 @@ QPointer<Controller> PopoverBalloonWidget::getController()
     }
     m_container = new WidgetContainer(m_owner);
     m_controller->setContainer(m_container, m_features);
+    if (m_controller->getContainer() != m_container) {
+        m_container->hide(); // another control's popover under the same id, with its own content
+    }
     m_controller->setPersistence(true);
     return m_controller;
 }

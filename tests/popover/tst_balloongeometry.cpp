@@ -710,28 +710,38 @@ void TestBalloonGeometry::extremeNumbersHold()
 void TestBalloonGeometry::theLookReadsWellOnEveryPalette_data()
 {
     QTest::addColumn<QColor>("window");
+    QTest::addColumn<QColor>("button");
     QTest::addColumn<QColor>("text");
+    QTest::addColumn<QColor>("body");
 
-    QTest::newRow("light") << QColor(239, 239, 239) << QColor(0, 0, 0);
-    QTest::newRow("white") << QColor(255, 255, 255) << QColor(30, 30, 30);
-    QTest::newRow("dark") << QColor(38, 41, 46) << QColor(225, 228, 232);
-    QTest::newRow("black") << QColor(0, 0, 0) << QColor(255, 255, 255);
-    QTest::newRow("blue") << QColor(20, 40, 90) << QColor(235, 240, 255);
+    const QColor grey(239, 239, 239);
+    const QColor raised(35, 43, 55);
+    QTest::newRow("light") << grey << grey << QColor(0, 0, 0) << grey;
+    QTest::newRow("white") << QColor(255, 255, 255) << grey << QColor(30, 30, 30) << grey;
+    QTest::newRow("dark") << QColor(18, 22, 29) << raised << QColor(231, 235, 242) << raised;
+    QTest::newRow("black") << QColor(0, 0, 0) << raised << QColor(255, 255, 255) << raised;
+    QTest::newRow("dark with light buttons") << QColor(18, 22, 29) << grey << QColor(231, 235, 242)
+                                             << QColor(18, 22, 29);
+    QTest::newRow("light with dark buttons") << grey << raised << QColor(0, 0, 0) << grey;
 }
 
 void TestBalloonGeometry::theLookReadsWellOnEveryPalette()
 {
     QFETCH(QColor, window);
+    QFETCH(QColor, button);
     QFETCH(QColor, text);
+    QFETCH(QColor, body);
     QPalette palette;
     palette.setColor(QPalette::Window, window);
+    palette.setColor(QPalette::Button, button);
     palette.setColor(QPalette::WindowText, text);
     const BalloonLook look = BalloonLook::resolved(QColor(), QColor(), QColor(), palette);
-    QVERIFY(contrast(look.upper, text) >= 7);
-    QVERIFY(contrast(look.lower, text) >= 7);
+    QCOMPARE(look.upper, body);
+    QCOMPARE(look.lower, body);
+    QVERIFY(contrast(body, text) >= 7);
     // The border is seen against the window around and against the body.
     QVERIFY(contrast(look.border, window) >= 1.5);
-    QVERIFY(contrast(look.border, look.upper) >= 1.5);
+    QVERIFY(contrast(look.border, body) >= 1.5);
     QCOMPARE(look.border.alpha(), 255);
 }
 

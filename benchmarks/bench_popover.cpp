@@ -1,0 +1,242 @@
+// SPDX-License-Identifier: MIT
+// Popovers beside what Qt offers for the same: a list of buttons in a scroll area, a menu shown again. Each figure
+// that counts is a ratio of the two, taken in turns in one run.
+#include "popover/Balloon.h"
+#include "popover/BalloonGeometry.h"
+#include "popover/Container.h"
+#include "popover/Controller.h"
+#include "popover/Item.h"
+#include "popover/Manager.h"
+
+#include <benchmark/benchmark.h>
+
+#include <QtCore/QEvent>
+#include <QtWidgets/QApplication>
+#include <QtWidgets/QMenu>
+#include <QtWidgets/QPushButton>
+#include <QtWidgets/QScrollArea>
+#include <QtWidgets/QVBoxLayout>
+
+#include <algorithm>
+#include <ctime>
+#include <memory>
+#include <vector>
+
+namespace
+{
+using vx::PopoverWidget::Balloon;
+using vx::PopoverWidget::Container;
+using vx::PopoverWidget::Controller;
+using vx::PopoverWidget::Item;
+using vx::PopoverWidget::Manager;
+namespace BalloonGeometry = vx::PopoverWidget::BalloonGeometry;
+
+constexpr int c_PopoverId = 0;
+
+class Row : public Item
+{
+public:
+    explicit Row(int id)
+        : Item(nullptr, vx::PopoverWidget::eifText, id, QStringLiteral("row"), QStringLiteral("Camera"), QString())
+    {
+    }
+};
+
+void settle()
+{
+    QCoreApplication::processEvents();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    QCoreApplication::processEvents();
+}
+
+// The window that everything opens in.
+struct Stage
+{
+    Stage()
+    {
+        window.resize(800, 600);
+        target = new QPushButton(QStringLiteral("Target"), &window);
+        target->move(360, 40);
+        window.show();
+        settle();
+    }
+
+    QPointer<Controller> makePopover(int rows)
+    {
+        QPointer<Controller> controller = Manager::instance()->createController(c_PopoverId, false, false, &window,
+            target, QStringLiteral("Cameras"), QString(), Balloon::eadTop | Balloon::eadBottom, QSizeF(),
+            Balloon::ESizeConstraints());
+        auto* const content = new Container(nullptr, QStringLiteral("rows"), Qt::Vertical, Qt::AlignTop);
+        for (int i = 0; i < rows; ++i) {
+            content->addItem(new Row(i));
+        }
+        controller->setContainer(content, Balloon::ebfTitle | Balloon::ebfClose);
+        return controller;
+    }
+
+    QWidget window;
+    QPushButton* target = nullptr;
+};
+
+// Of this process, so that what else the machine does is left out.
+double cpuSeconds()
+{
+    return static_cast<double>(std::clock()) / CLOCKS_PER_SEC;
+}
+
+double median(std::vector<double> values)
+{
+    std::nth_element(values.begin(), values.begin() + static_cast<long>(values.size() / 2), values.end());
+    return values.at(values.size() / 2);
+}
+
+// Runs both in turns until the benchmark has enough, and reports their medians and the ratio.
+template<class Ours, class Theirs>
+void besideEachOther(benchmark::State& state, int repetitions, const Ours& ours, const Theirs& theirs)
+{
+    ours();
+    theirs();
+    std::vector<double> ourTimes;
+    std::vector<double> theirTimes;
+    for (auto _ : state) {
+        const double start = cpuSeconds();
+        for (int i = 0; i < repetitions; ++i) {
+            ours();
+        }
+        const double middle = cpuSeconds();
+        for (int i = 0; i < repetitions; ++i) {
+            theirs();
+        }
+        ourTimes.push_back((middle - start) / repetitions);
+        theirTimes.push_back((cpuSeconds() - middle) / repetitions);
+        state.SetIterationTime(middle - start);
+    }
+    state.counters["popover_ms"] = 1e3 * median(ourTimes);
+    state.counters["baseline_ms"] = 1e3 * median(theirTimes);
+    state.counters["ratio"] = median(ourTimes) / median(theirTimes);
+}
+
+void buildShowDestroy(benchmark::State& state)
+{
+    Stage stage;
+    const int rows = static_cast<int>(state.range(0));
+    besideEachOther(
+        state, 1,
+        [&stage, rows] {
+            const QPointer<Controller> controller = stage.makePopover(rows);
+            controller->setActive(true, Controller::epsBalloon | Controller::epsNoFade, true);
+            settle();
+            delete controller.data();
+            settle();
+        },
+        [&stage, rows] {
+            auto* const area = new QScrollArea(&stage.window);
+            auto* const content = new QWidget;
+            auto* const layout = new QVBoxLayout(content);
+            layout->setSpacing(0);
+            for (int i = 0; i < rows; ++i) {
+                auto* const button = new QPushButton(QStringLiteral("Camera"));
+                button->setFlat(true);
+                layout->addWidget(button);
+            }
+            area->setWidgetResizable(true);
+            area->setWidget(content);
+            area->setGeometry(300, 70, 200, 500);
+            area->show();
+            settle();
+            delete area;
+            settle();
+        });
+}
+BENCHMARK(buildShowDestroy)->Arg(10)->Arg(100)->Arg(1000)->UseManualTime()->MinTime(1)->Unit(benchmark::kMillisecond);
+
+void reopen(benchmark::State& state)
+{
+    Stage stage;
+    const QPointer<Controller> controller = stage.makePopover(10);
+    controller->setPersistence(true);
+    QMenu menu(&stage.window);
+    for (int i = 0; i < 10; ++i) {
+        menu.addAction(QStringLiteral("Camera"));
+    }
+    besideEachOther(
+        state, 10,
+        [&controller] {
+            controller->setActive(true, Controller::epsBalloon | Controller::epsNoFade, true);
+            settle();
+            controller->dismiss(false, true);
+            settle();
+        },
+        [&stage, &menu] {
+            menu.popup(stage.window.mapToGlobal(QPoint(360, 70)));
+            settle();
+            menu.hide();
+            settle();
+        });
+    delete controller.data();
+}
+BENCHMARK(reopen)->UseManualTime()->Unit(benchmark::kMillisecond);
+
+// One layout pass for each step of the target, and what follows from it, beside the steps of a plain widget.
+void followTarget(benchmark::State& state)
+{
+    Stage stage;
+    const QPointer<Controller> controller = stage.makePopover(static_cast<int>(state.range(0)));
+    controller->setActive(true, Controller::epsBalloon | Controller::epsNoFade, true);
+    settle();
+    auto* const plain = new QWidget(&stage.window);
+    plain->setGeometry(controller->balloon()->geometry());
+    int x = 0;
+    int plainX = 0;
+    besideEachOther(
+        state, 1000,
+        [&stage, &x] {
+            x = (x + 3) % 300;
+            stage.target->move(200 + x, 40);
+        },
+        [plain, &plainX] {
+            plainX = (plainX + 3) % 300;
+            plain->move(200 + plainX, 40);
+        });
+    settle();
+    delete controller.data();
+}
+BENCHMARK(followTarget)->Arg(10)->Arg(1000)->UseManualTime()->Iterations(20)->Unit(benchmark::kMillisecond);
+
+// From the target to frame and outline, without a widget.
+void geometry(benchmark::State& state)
+{
+    using namespace BalloonGeometry;
+    const QRect parent(0, 0, 800, 600);
+    int x = 0;
+    for (auto _ : state) {
+        x = (x + 7) % 760;
+        const QRect target(x, 120, 40, 20);
+        const int side = preferredSide(parent, target, target.topLeft(), 15);
+        const QPointF anchor = anchorPoint(target, QPointF(-1, 0), side, target.topLeft());
+        const QSize size = sizeFromContent(
+            contentSize(QSize(180, 240), QSize(0, 0), QSize(16777215, 16777215)), side, 4, 15, 0,
+            {Strip{true, QSize(120, 24)}, Strip(), Strip()});
+        const QRect rect = toRect(
+            frame(limits(QRectF(parent), QMargins(4, 4, 4, 4)), QSizeF(size), anchor, side, 4));
+        const QPointF tip = anchor - rect.topLeft();
+        const QRectF inner = innerRect(QRectF(0, 0, rect.width(), rect.height()), side, 15);
+        benchmark::DoNotOptimize(outline(inner, 6, arrowDrawn(15, inner, tip), 15, side, tip));
+    }
+}
+BENCHMARK(geometry);
+}
+
+int main(int argc, char** argv)
+{
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) {
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    }
+    qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString&) {}); // the offscreen plugin chats
+    QApplication application(argc, argv);
+    Manager::init(1000);
+    benchmark::Initialize(&argc, argv);
+    benchmark::RunSpecifiedBenchmarks();
+    Manager::deleteInstance();
+    return 0;
+}
