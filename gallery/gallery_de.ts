@@ -809,6 +809,133 @@
         <source>TCustomClickWidget tells short, long and context clicks apart and asks for rights; CustomContextClickToolButton adds an arrow.</source>
         <translation>TCustomClickWidget unterscheidet kurze, lange und Kontextklicks und fragt nach Rechten; CustomContextClickToolButton hat dazu einen Pfeil.</translation>
     </message>
+    <message>
+        <source>Popovers</source>
+        <translation>Popover</translation>
+    </message>
+    <message>
+        <source>A popover points at what it belongs to, keeps inside the window and closes with a click beside it. Click a number.</source>
+        <translation>Ein Popover zeigt auf das, wozu es gehört, bleibt im Fenster und schließt sich bei einem Klick daneben. Klicken Sie auf eine Zahl.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PopoversPage</name>
+    <message>
+        <source>Camera %1</source>
+        <translation>Kamera %1</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>offline</translation>
+    </message>
+    <message>
+        <source>live</source>
+        <translation>live</translation>
+    </message>
+    <message>
+        <source>Sides of the arrow</source>
+        <translation>Seiten des Pfeils</translation>
+    </message>
+    <message>
+        <source>Top: below the target</source>
+        <translation>Oben: unter dem Ziel</translation>
+    </message>
+    <message>
+        <source>Bottom: above the target</source>
+        <translation>Unten: über dem Ziel</translation>
+    </message>
+    <message>
+        <source>Left: right of the target</source>
+        <translation>Links: rechts vom Ziel</translation>
+    </message>
+    <message>
+        <source>Right: left of the target</source>
+        <translation>Rechts: links vom Ziel</translation>
+    </message>
+    <message>
+        <source>Features</source>
+        <translation>Merkmale</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titel</translation>
+    </message>
+    <message>
+        <source>Close button</source>
+        <translation>Schließen-Knopf</translation>
+    </message>
+    <message>
+        <source>Help button</source>
+        <translation>Hilfe-Knopf</translation>
+    </message>
+    <message>
+        <source>No title bar</source>
+        <translation>Keine Titelleiste</translation>
+    </message>
+    <message>
+        <source>%1 rows</source>
+        <translation>%1 Zeilen</translation>
+    </message>
+    <message>
+        <source>Grow from the middle</source>
+        <translation>Aus der Mitte wachsen</translation>
+    </message>
+    <message>
+        <source>Modal</source>
+        <translation>Modal</translation>
+    </message>
+    <message>
+        <source>Ask</source>
+        <translation>Fragen</translation>
+    </message>
+    <message>
+        <source>No answer yet</source>
+        <translation>Noch keine Antwort</translation>
+    </message>
+    <message>
+        <source>Drag help</source>
+        <translation>Hilfe beim Ziehen</translation>
+    </message>
+    <message>
+        <source>Drag a camera: the popover that takes it comes up.</source>
+        <translation>Ziehen Sie eine Kamera: Das Popover, das sie annimmt, erscheint.</translation>
+    </message>
+    <message>
+        <source>Nothing dropped yet</source>
+        <translation>Noch nichts abgelegt</translation>
+    </message>
+    <message>
+        <source>Cameras</source>
+        <translation>Kameras</translation>
+    </message>
+    <message>
+        <source>Delete the recording?</source>
+        <translation>Aufnahme löschen?</translation>
+    </message>
+    <message>
+        <source>Camera 3, today from 10:00 to 10:45</source>
+        <translation>Kamera 3, heute von 10:00 bis 10:45</translation>
+    </message>
+    <message>
+        <source>Accepted: 1</source>
+        <translation>Angenommen: 1</translation>
+    </message>
+    <message>
+        <source>Rejected: 0</source>
+        <translation>Abgelehnt: 0</translation>
+    </message>
+    <message>
+        <source>Favourites</source>
+        <translation>Favoriten</translation>
+    </message>
+    <message>
+        <source>Drop it here</source>
+        <translation>Hier ablegen</translation>
+    </message>
+    <message>
+        <source>Dropped: %1</source>
+        <translation>Abgelegt: %1</translation>
+    </message>
 </context>
 <context>
     <name>gallery::ScrollBarsPage</name>

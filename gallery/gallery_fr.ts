@@ -809,6 +809,133 @@
         <source>TCustomClickWidget tells short, long and context clicks apart and asks for rights; CustomContextClickToolButton adds an arrow.</source>
         <translation>TCustomClickWidget distingue les clics courts, longs et contextuels et demande les droits ; CustomContextClickToolButton ajoute une flèche.</translation>
     </message>
+    <message>
+        <source>Popovers</source>
+        <translation>Popovers</translation>
+    </message>
+    <message>
+        <source>A popover points at what it belongs to, keeps inside the window and closes with a click beside it. Click a number.</source>
+        <translation>Un popover pointe vers ce à quoi il appartient, reste dans la fenêtre et se ferme d’un clic à côté. Cliquez sur un nombre.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PopoversPage</name>
+    <message>
+        <source>Camera %1</source>
+        <translation>Caméra %1</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>hors ligne</translation>
+    </message>
+    <message>
+        <source>live</source>
+        <translation>en direct</translation>
+    </message>
+    <message>
+        <source>Sides of the arrow</source>
+        <translation>Côtés de la flèche</translation>
+    </message>
+    <message>
+        <source>Top: below the target</source>
+        <translation>Haut : sous la cible</translation>
+    </message>
+    <message>
+        <source>Bottom: above the target</source>
+        <translation>Bas : au-dessus de la cible</translation>
+    </message>
+    <message>
+        <source>Left: right of the target</source>
+        <translation>Gauche : à droite de la cible</translation>
+    </message>
+    <message>
+        <source>Right: left of the target</source>
+        <translation>Droite : à gauche de la cible</translation>
+    </message>
+    <message>
+        <source>Features</source>
+        <translation>Éléments</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titre</translation>
+    </message>
+    <message>
+        <source>Close button</source>
+        <translation>Bouton de fermeture</translation>
+    </message>
+    <message>
+        <source>Help button</source>
+        <translation>Bouton d’aide</translation>
+    </message>
+    <message>
+        <source>No title bar</source>
+        <translation>Sans barre de titre</translation>
+    </message>
+    <message>
+        <source>%1 rows</source>
+        <translation>%1 lignes</translation>
+    </message>
+    <message>
+        <source>Grow from the middle</source>
+        <translation>Grandir depuis le centre</translation>
+    </message>
+    <message>
+        <source>Modal</source>
+        <translation>Modal</translation>
+    </message>
+    <message>
+        <source>Ask</source>
+        <translation>Demander</translation>
+    </message>
+    <message>
+        <source>No answer yet</source>
+        <translation>Pas encore de réponse</translation>
+    </message>
+    <message>
+        <source>Drag help</source>
+        <translation>Aide au glisser</translation>
+    </message>
+    <message>
+        <source>Drag a camera: the popover that takes it comes up.</source>
+        <translation>Faites glisser une caméra : le popover qui l’accepte apparaît.</translation>
+    </message>
+    <message>
+        <source>Nothing dropped yet</source>
+        <translation>Rien n’a encore été déposé</translation>
+    </message>
+    <message>
+        <source>Cameras</source>
+        <translation>Caméras</translation>
+    </message>
+    <message>
+        <source>Delete the recording?</source>
+        <translation>Supprimer l’enregistrement ?</translation>
+    </message>
+    <message>
+        <source>Camera 3, today from 10:00 to 10:45</source>
+        <translation>Caméra 3, aujourd’hui de 10:00 à 10:45</translation>
+    </message>
+    <message>
+        <source>Accepted: 1</source>
+        <translation>Accepté : 1</translation>
+    </message>
+    <message>
+        <source>Rejected: 0</source>
+        <translation>Refusé : 0</translation>
+    </message>
+    <message>
+        <source>Favourites</source>
+        <translation>Favoris</translation>
+    </message>
+    <message>
+        <source>Drop it here</source>
+        <translation>Déposez-la ici</translation>
+    </message>
+    <message>
+        <source>Dropped: %1</source>
+        <translation>Déposé : %1</translation>
+    </message>
 </context>
 <context>
     <name>gallery::ScrollBarsPage</name>
