@@ -13,6 +13,7 @@
 #include "pages/MouseGesturesPage.h"
 #include "pages/PopoversPage.h"
 #include "pages/ScrollBarsPage.h"
+#include "pages/TimeLinePage.h"
 
 namespace gallery
 {
@@ -81,6 +82,12 @@ const QVector<PageEntry>& pages()
                            "A popover points at what it belongs to, keeps inside the window and closes with a click "
                            "beside it. Click a number."),
          &make<PopoversPage>},
+        {"time-line", QT_TRANSLATE_NOOP("gallery::PageList", "Sliders"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Time line"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "MultiNubsieSlider has any number of handles on one scale, kept apart only as far as "
+                           "needed. Drag them, double-click them, click the flags."),
+         &make<TimeLinePage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

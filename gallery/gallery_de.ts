@@ -817,6 +817,14 @@
         <source>A popover points at what it belongs to, keeps inside the window and closes with a click beside it. Click a number.</source>
         <translation>Ein Popover zeigt auf das, wozu es gehört, bleibt im Fenster und schließt sich bei einem Klick daneben. Klicken Sie auf eine Zahl.</translation>
     </message>
+    <message>
+        <source>Time line</source>
+        <translation>Zeitleiste</translation>
+    </message>
+    <message>
+        <source>MultiNubsieSlider has any number of handles on one scale, kept apart only as far as needed. Drag them, double-click them, click the flags.</source>
+        <translation>MultiNubsieSlider hat beliebig viele Griffe auf einer Skala, die nur so weit wie nötig auseinanderrücken. Ziehen Sie sie, doppelklicken Sie darauf, klicken Sie auf die Fahnen.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PopoversPage</name>
@@ -1009,6 +1017,85 @@
     <message>
         <source>Arguments</source>
         <translation>Argumente</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::TimeLinePage</name>
+    <message>
+        <source>Drag the blue handle through the day. The farther you pull away from the bar, the slower it goes, down to single seconds. The flags go with the ends of the range.</source>
+        <translation>Ziehen Sie den blauen Griff durch den Tag. Je weiter Sie sich von der Leiste entfernen, desto langsamer läuft er, bis hinab zu einzelnen Sekunden. Die Fahnen gehen mit den Enden des Bereichs.</translation>
+    </message>
+    <message>
+        <source>A day of recordings</source>
+        <translation>Ein Tag Aufzeichnungen</translation>
+    </message>
+    <message>
+        <source>Handles that share a scale</source>
+        <translation>Griffe auf einer Skala</translation>
+    </message>
+    <message>
+        <source>Close values are pushed apart. Take one out, and its neighbours drift home.</source>
+        <translation>Nahe Werte rücken auseinander. Nimmt man einen heraus, gleiten die Nachbarn zurück.</translation>
+    </message>
+    <message>
+        <source>Kinds of handles</source>
+        <translation>Arten von Griffen</translation>
+    </message>
+    <message>
+        <source>Five steps</source>
+        <translation>Fünf Stufen</translation>
+    </message>
+    <message>
+        <source>Spring</source>
+        <translation>Feder</translation>
+    </message>
+    <message>
+        <source>Inverted</source>
+        <translation>Umgekehrt</translation>
+    </message>
+    <message>
+        <source>Numbers</source>
+        <translation>Zahlen</translation>
+    </message>
+    <message>
+        <source>Fading</source>
+        <translation>Verblassen</translation>
+    </message>
+    <message>
+        <source>Jumping</source>
+        <translation>Springen</translation>
+    </message>
+    <message>
+        <source>Minimum and maximum while a handle is in use</source>
+        <translation>Minimum und Maximum, solange ein Griff in Gebrauch ist</translation>
+    </message>
+    <message>
+        <source>The bar fades when the pointer leaves</source>
+        <translation>Die Leiste verblasst, wenn der Zeiger sie verlässt</translation>
+    </message>
+    <message>
+        <source>A click on the track moves the only handle</source>
+        <translation>Ein Klick auf die Leiste versetzt den einzigen Griff</translation>
+    </message>
+    <message>
+        <source>Features</source>
+        <translation>Merkmale</translation>
+    </message>
+    <message>
+        <source>Start of the range to export</source>
+        <translation>Anfang des Exportbereichs</translation>
+    </message>
+    <message>
+        <source>End of the range to export</source>
+        <translation>Ende des Exportbereichs</translation>
+    </message>
+    <message>
+        <source>Moment that is shown</source>
+        <translation>Gezeigter Zeitpunkt</translation>
+    </message>
+    <message>
+        <source>To export: %1 to %2</source>
+        <translation>Zu exportieren: %1 bis %2</translation>
     </message>
 </context>
 </TS>

@@ -817,6 +817,14 @@
         <source>A popover points at what it belongs to, keeps inside the window and closes with a click beside it. Click a number.</source>
         <translation>Un popover pointe vers ce à quoi il appartient, reste dans la fenêtre et se ferme d’un clic à côté. Cliquez sur un nombre.</translation>
     </message>
+    <message>
+        <source>Time line</source>
+        <translation>Ligne de temps</translation>
+    </message>
+    <message>
+        <source>MultiNubsieSlider has any number of handles on one scale, kept apart only as far as needed. Drag them, double-click them, click the flags.</source>
+        <translation>MultiNubsieSlider porte autant de poignées que l&apos;on veut sur une échelle, écartées seulement autant qu&apos;il le faut. Faites-les glisser, double-cliquez-les, cliquez sur les drapeaux.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PopoversPage</name>
@@ -1009,6 +1017,85 @@
     <message>
         <source>Arguments</source>
         <translation>Arguments</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::TimeLinePage</name>
+    <message>
+        <source>Drag the blue handle through the day. The farther you pull away from the bar, the slower it goes, down to single seconds. The flags go with the ends of the range.</source>
+        <translation>Faites glisser la poignée bleue à travers la journée. Plus vous vous éloignez de la barre, plus elle ralentit, jusqu&apos;à la seconde près. Les drapeaux suivent les extrémités de la plage.</translation>
+    </message>
+    <message>
+        <source>A day of recordings</source>
+        <translation>Une journée d&apos;enregistrements</translation>
+    </message>
+    <message>
+        <source>Handles that share a scale</source>
+        <translation>Des poignées sur une échelle</translation>
+    </message>
+    <message>
+        <source>Close values are pushed apart. Take one out, and its neighbours drift home.</source>
+        <translation>Les valeurs proches s&apos;écartent. Retirez-en une, et ses voisines reviennent.</translation>
+    </message>
+    <message>
+        <source>Kinds of handles</source>
+        <translation>Sortes de poignées</translation>
+    </message>
+    <message>
+        <source>Five steps</source>
+        <translation>Cinq crans</translation>
+    </message>
+    <message>
+        <source>Spring</source>
+        <translation>Ressort</translation>
+    </message>
+    <message>
+        <source>Inverted</source>
+        <translation>Inversée</translation>
+    </message>
+    <message>
+        <source>Numbers</source>
+        <translation>Nombres</translation>
+    </message>
+    <message>
+        <source>Fading</source>
+        <translation>Fondu</translation>
+    </message>
+    <message>
+        <source>Jumping</source>
+        <translation>Saut</translation>
+    </message>
+    <message>
+        <source>Minimum and maximum while a handle is in use</source>
+        <translation>Minimum et maximum tant qu&apos;une poignée est utilisée</translation>
+    </message>
+    <message>
+        <source>The bar fades when the pointer leaves</source>
+        <translation>La barre s&apos;estompe quand le pointeur la quitte</translation>
+    </message>
+    <message>
+        <source>A click on the track moves the only handle</source>
+        <translation>Un clic sur la barre déplace l&apos;unique poignée</translation>
+    </message>
+    <message>
+        <source>Features</source>
+        <translation>Options</translation>
+    </message>
+    <message>
+        <source>Start of the range to export</source>
+        <translation>Début de la plage à exporter</translation>
+    </message>
+    <message>
+        <source>End of the range to export</source>
+        <translation>Fin de la plage à exporter</translation>
+    </message>
+    <message>
+        <source>Moment that is shown</source>
+        <translation>Moment affiché</translation>
+    </message>
+    <message>
+        <source>To export: %1 to %2</source>
+        <translation>À exporter : de %1 à %2</translation>
     </message>
 </context>
 </TS>

@@ -357,6 +357,8 @@ private:
     void dragNubsie(QMouseEvent* event);
     void dragNubsieInSteps(const QPointF& pointer, double target);
     double fineSpeed(const QPointF& pointer) const;
+    QRect rectOnSlider(const Nubsie* nubsie) const;
+    void updateAfterStep(const QRect& before);
     void settleDrag(const QPoint& position);
     bool settleClick();
     void closeGesture();

@@ -166,6 +166,7 @@ void MultiNubsieSlider::dragNubsie(QMouseEvent* event)
     const QRectF bar = sliderBarRect();
     const double size = sizeAlong(held->getSize(), horizontal);
     const double display = held->getDisplayValue();
+    const QRect before = rectOnSlider(held);
 
     // The pointer as if it had taken the handle exactly at its centre.
     const QPointF pointer
@@ -176,6 +177,9 @@ void MultiNubsieSlider::dragNubsie(QMouseEvent* event)
 
     if (held->getCurrentFeature().testFlag(Nubsie::enfDiscreteSteps)) {
         dragNubsieInSteps(pointer, target);
+        if (self) {
+            updateAfterStep(before);
+        }
         return;
     }
 
@@ -208,8 +212,24 @@ void MultiNubsieSlider::dragNubsie(QMouseEvent* event)
     m_lastMoveStamp = now;
     updateNubsieLayer(m_currentNubsie);
     if (self) {
-        update();
+        updateAfterStep(before);
     }
+}
+
+QRect MultiNubsieSlider::rectOnSlider(const Nubsie* nubsie) const
+{
+    return QRect(mapFromGlobal(nubsie->mapToGlobal(QPoint(0, 0))), nubsie->size());
+}
+
+// Repainting the whole slider would repaint all the handles on it.
+void MultiNubsieSlider::updateAfterStep(const QRect& before)
+{
+    if (!m_currentNubsie || m_features.testFlag(emfShowValueLabel) || m_features.testFlag(emfShowRangeLabels)) {
+        update();
+        return;
+    }
+    update(before);
+    update(rectOnSlider(m_currentNubsie));
 }
 
 double MultiNubsieSlider::fineSpeed(const QPointF& pointer) const
@@ -248,9 +268,6 @@ void MultiNubsieSlider::dragNubsieInSteps(const QPointF& pointer, double target)
     held->performDragAction();
     if (self && m_currentNubsie) {
         updateNubsieLayer(m_currentNubsie);
-    }
-    if (self) {
-        update();
     }
 }
 

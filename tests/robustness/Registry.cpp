@@ -10,6 +10,7 @@ const std::vector<Entry>& registry()
         std::vector<Entry> all;
         for (const std::vector<Entry>& room :
             {platformEntries(), foundationEntries(), indicatorsEntries(), inputEntries(), slidersEntries(),
+                nubsieEntries(), timeLineEntries(),
                 viewsEntries(),
                 popoverItemEntries(), balloonEntries(), controllerEntries(), modelsEntries(), clickEntries(),
                 labelEntries(), switchEntries(), editsEntries(), overlayEntries()}) {

@@ -82,6 +82,8 @@ std::vector<Entry> inputEntries();
 std::vector<Entry> clickEntries();
 std::vector<Entry> balloonEntries();
 std::vector<Entry> slidersEntries();
+std::vector<Entry> nubsieEntries();
+std::vector<Entry> timeLineEntries();
 std::vector<Entry> popoverItemEntries();
 std::vector<Entry> modelsEntries();
 std::vector<Entry> viewsEntries();
