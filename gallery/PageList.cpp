@@ -76,18 +76,18 @@ const QVector<PageEntry>& pages()
                            "NicerScrollBar floats over the content of a scroll area and fades; JumpSlider follows "
                            "a click on its groove at once."),
          &make<ScrollBarsPage>},
-        {"popovers", QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
-         QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
-         QT_TRANSLATE_NOOP("gallery::PageList",
-                           "A popover points at what it belongs to, keeps inside the window and closes with a click "
-                           "beside it. Click a number."),
-         &make<PopoversPage>},
         {"time-line", QT_TRANSLATE_NOOP("gallery::PageList", "Sliders"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Time line"),
          QT_TRANSLATE_NOOP("gallery::PageList",
                            "MultiNubsieSlider has any number of handles on one scale, kept apart only as far as "
                            "needed. Drag them, double-click them, click the flags."),
          &make<TimeLinePage>},
+        {"popovers", QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "A popover points at what it belongs to, keeps inside the window and closes with a click "
+                           "beside it. Click a number."),
+         &make<PopoversPage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

@@ -17,6 +17,7 @@
 
 #include "../cameras/Scene.h"
 #include "../Hand.h"
+#include "popover/Manager.h"
 #include "sliders/MultiNubsieSlider.h"
 
 namespace gallery
@@ -166,6 +167,9 @@ private:
 TimeLinePage::TimeLinePage(SignalLog& log, QWidget* parent)
     : Page(log, parent)
 {
+    // For the balloons of handles.
+    vx::PopoverWidget::Manager::init(1000);
+
     auto* below = new QHBoxLayout;
     below->setSpacing(12);
     below->addWidget(makeCluster(), 3);
@@ -348,6 +352,7 @@ void TimeLinePage::addHandles()
     m_day->setToolTipText(hMoment, tr("Moment that is shown"));
     m_day->addFeatures(hMoment, Nubsie::enfDateMode);
     m_day->setStartEndDates(hMoment, midnight(), midnight().addDays(1));
+    m_day->setPopoverFeatures(hMoment, vx::PopoverWidget::Balloon::ebfNoHeader);
     m_day->setProgress(0.82);
     m_day->showFlags(true);
 
@@ -420,7 +425,8 @@ bool TimeLinePage::eventFilter(QObject* object, QEvent* event)
 
 void TimeLinePage::showMoment()
 {
-    const int seconds = m_day->value(hMoment);
+    // As the balloon has it: between two whole seconds it is still the first.
+    const int seconds = int(midnight().secsTo(m_day->getDate(hMoment)));
     m_recording->setMoment(seconds);
     m_moment->setText(clock(seconds));
 }
