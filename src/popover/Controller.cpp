@@ -45,7 +45,8 @@ Controller::Controller(QWidget* inWidget, QWidget* forWidget, bool isSubControll
 
 Controller::Controller(QWidget* inWidget, bool isSubController, const QString& objectName, const QSizeF& size,
     QFlags<Balloon::ESizeConstraint> constraints)
-    : Controller(inWidget, nullptr, isSubController, objectName, QFlags<Balloon::EArrowDirection>(), size, constraints)
+    : Controller(
+        inWidget, nullptr, isSubController, objectName, QFlags<Balloon::EArrowDirection>(), size, constraints)
 {
 }
 
@@ -130,7 +131,8 @@ void Controller::setInWidget(QWidget* widget)
     if (widget == nullptr) {
         return;
     }
-    while (!widget->isWindow() && qobject_cast<Controller*>(widget) == nullptr && widget->parentWidget() != nullptr) {
+    while (
+        !widget->isWindow() && qobject_cast<Controller*>(widget) == nullptr && widget->parentWidget() != nullptr) {
         widget = widget->parentWidget();
     }
     setParent(widget);
@@ -281,8 +283,8 @@ bool Controller::appear(bool animated)
     return self != nullptr;
 }
 
-// A popover that is opened again before it has gone, or closed before it has come, must not be caught up by the end
-// of the motion that it left.
+// A popover that is opened again before it has gone, or closed before it has come, must not be caught up by the
+// end of the motion that it left.
 void Controller::leaveInterruptedMotion()
 {
     const QPointer<Controller> self(this);
@@ -362,8 +364,8 @@ void Controller::dismiss(bool animated, bool force)
         return;
     }
     if (prohibited) {
-        ZELKOV_LOG(
-            vx::c_LogTrace, "vx::PopoverWidget::Controller::dismiss", "closing of controller prohibited by Container!");
+        ZELKOV_LOG(vx::c_LogTrace, "vx::PopoverWidget::Controller::dismiss",
+            "closing of controller prohibited by Container!");
     } else {
         if (m_container != nullptr) {
             m_container->popoverClosing();

@@ -11,8 +11,8 @@
 #include <QFlags>
 #include <QMargins>
 #include <QMetaType>
-#include <QPointF>
 #include <QPointer>
+#include <QPointF>
 #include <QRect>
 #include <QSizeF>
 #include <QString>
@@ -29,13 +29,13 @@ class Container;
 class Manager;
 
 /// One popover: an overlay that covers a window (or another popover) and holds the balloon with the content. It
-/// opens and closes the balloon, with fades and a grow animation if wanted, runs modally on request and reports the
-/// result. A click that begins and ends outside the balloon closes the popover.
+/// opens and closes the balloon, with fades and a grow animation if wanted, runs modally on request and reports
+/// the result. A click that begins and ends outside the balloon closes the popover.
 ///
 /// Controllers are made by Manager::createController(). Then: setContainer() with the content, setForWidget() or
-/// setForRect() to point at something, setActive() or exec(). The covered window owns the controller; the controller
-/// owns the balloon, and the balloon's scroll area the container. After closing, the controller deletes itself and
-/// all of these, unless it is persistent.
+/// setForRect() to point at something, setActive() or exec(). The covered window owns the controller; the
+/// controller owns the balloon, and the balloon's scroll area the container. After closing, the controller deletes
+/// itself and all of these, unless it is persistent.
 ///
 /// Signals of an opening with the default flags: popoverWillAppear, popoverDidAppear, balloonOpened (layoutUpdated
 /// comes in between, with each layout pass). Of a closing: balloonClosed, popoverWillDisappear, and at the end of
@@ -54,7 +54,7 @@ public:
         /// The balloon grows from the centre and shrinks to it, each in 400 ms; ignored with epsBalloon. Without
         /// either flag the balloon is neither shown nor hidden, and closing hides nothing at all.
         epsGrow = 2,
-        epsNoFade = 4,          ///< The overlay is shown at once, even if animated.
+        epsNoFade = 4, ///< The overlay is shown at once, even if animated.
         epsMouseTransparent = 8 ///< The mouse goes through the overlay; a press outside does not close.
     };
     Q_DECLARE_FLAGS(EPopoverShowFlags, EPopoverShowFlag)
@@ -69,8 +69,8 @@ public:
     /// Header and footer of the container must be there by now.
     void setContainer(Container* container, QFlags<Balloon::EBalloonFeature> features);
 
-    /// Points the balloon at \a widget, whose moves and resizes it follows from now on. A coordinate of \a relative,
-    /// a point inside the widget, counts if it is greater than 0. Needs the balloon.
+    /// Points the balloon at \a widget, whose moves and resizes it follows from now on. A coordinate of \a
+    /// relative, a point inside the widget, counts if it is greater than 0. Needs the balloon.
     void setForWidget(QWidget& widget, const QPointF& relative);
 
     /// Covers the first ancestor of \a widget, itself included, that is a window or a controller, and becomes its
@@ -86,8 +86,8 @@ public:
     void setTitle(const QString& title);
     QString title() const;
 
-    /// Insets are added to the rectangle of a covered window as they stand: right and bottom ones shrink it only if
-    /// they are negative. They have no effect over another controller. Default 0.
+    /// Insets are added to the rectangle of a covered window as they stand: right and bottom ones shrink it only
+    /// if they are negative. They have no effect over another controller. Default 0.
     void setInsets(int left, int top, int right, int bottom);
     void adjustInsets(int left, int top, int right, int bottom);
     void getInsets(int& left, int& top, int& right, int& bottom) const;
@@ -134,22 +134,22 @@ Q_SIGNALS:
     /// Escape was released in a popover that stays visible.
     void shouldReject();
     /// An item of the content was performed.
-    void itemPerformed(int itemId, const QVariant& value, const QVariant& userData,
-        vx::PopoverWidget::EItemPerformedFlags flag);
+    void itemPerformed(
+        int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
     void marginsChanged(int left, int top, int right, int bottom);
     /// A layout pass has run. A resize of the window runs more than one.
     void layoutUpdated();
     /// Emitted by the destructor, while the controller is still whole.
     void controllerDestroyed(vx::PopoverWidget::Controller* controller);
-    /// Something in the format Item::sPopoverWidgetItem was dropped on the overlay or the balloon. \a item is the
-    /// source of the drag if that is an item, else null: a drag that an item has begun by itself belongs to the
-    /// item's window, and its id stands in the data. The event is valid during the emission only.
+    /// Something in the format Item::sPopoverWidgetItem was dropped on the overlay, or on a part of the balloon
+    /// that takes no drops itself. \a item is the item that was dragged, null if something else made the drag; the
+    /// position is global, and the event is valid during the emission only.
     void itemDropped(vx::PopoverWidget::Item* item, QDropEvent* dropEvent, const QPoint& globalPos);
 
 public Q_SLOTS:
     /// Opens or closes. Closing this way asks and tells the container nothing.
-    void setActive(bool active = true, EPopoverShowFlags showFlags = EPopoverShowFlags(QFlag(epsBalloon | epsNoFade)),
-        bool animated = true);
+    void setActive(bool active = true,
+        EPopoverShowFlags showFlags = EPopoverShowFlags(QFlag(epsBalloon | epsNoFade)), bool animated = true);
     /// Points the balloon at a rectangle in the controller's coordinates.
     void setForRect(const QRect& rect);
     /// Covers the covered widget again and lays out the balloon; only while visible, unless \a force.

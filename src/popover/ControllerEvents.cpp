@@ -37,8 +37,7 @@ void Controller::mouseReleaseEvent(QMouseEvent* event)
         FadableThing<QWidget>::mouseReleaseEvent(event);
         return;
     }
-    if (isClickOutside(
-            pressedOutside, m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible)) {
+    if (isClickOutside(pressedOutside, m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible)) {
         dismiss(true, false);
         event->accept();
     }

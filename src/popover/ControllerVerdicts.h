@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What a popover's controller decides, without a widget: ways of opening and closing, verdicts on presses and keys.
+// What a popover's controller decides, without a widget: ways of opening and closing, verdicts on presses and
+// keys.
 #pragma once
 
 #include <QMargins>
@@ -16,7 +17,7 @@ namespace PopoverWidget
 /// The way in which the balloon comes or goes.
 enum class EBalloonMotion
 {
-    None,   ///< It is left as it is.
+    None, ///< It is left as it is.
     AtOnce,
     Animated
 };
@@ -56,7 +57,7 @@ constexpr bool isClickOutside(bool pressedOutside, bool insideBalloon, bool clos
 enum class EKeyVerdict
 {
     NotOurs, ///< For the base class.
-    Ignore,  ///< Nothing happens, and the event is not accepted.
+    Ignore, ///< Nothing happens, and the event is not accepted.
     Reject,
     Dismiss,
     Accept
@@ -77,8 +78,8 @@ constexpr EKeyVerdict keyVerdict(int key, bool visible, bool stayVisible, bool c
 inline int saturatedSum(int a, int b)
 {
     const qint64 sum = qint64(a) + b;
-    return static_cast<int>(qBound(qint64(std::numeric_limits<int>::min()), sum,
-        qint64(std::numeric_limits<int>::max())));
+    return static_cast<int>(
+        qBound(qint64(std::numeric_limits<int>::min()), sum, qint64(std::numeric_limits<int>::max())));
 }
 
 inline QMargins saturatedSum(const QMargins& a, const QMargins& b)
@@ -87,8 +88,8 @@ inline QMargins saturatedSum(const QMargins& a, const QMargins& b)
         saturatedSum(a.bottom(), b.bottom())};
 }
 
-/// The area left of \a covered: insets are added as they stand, so that right and bottom ones shrink it only if they
-/// are negative; margins go inwards. Edges end where no widget can be.
+/// The area left of \a covered: insets are added as they stand, so that right and bottom ones shrink it only if
+/// they are negative; margins go inwards. Edges end where no widget can be.
 inline QRect coveredArea(const QRect& covered, const QMargins& insets, const QMargins& margins)
 {
     const auto edge = [](int at, int inset, qint64 margin) {

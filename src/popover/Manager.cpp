@@ -81,7 +81,8 @@ QPointer<Controller> Manager::createController(int id, bool reuse, bool isSubCon
     bool reused = false;
     QPointer<Controller> controller = reusedController(id, reuse, reused, objectName);
     if (!reused) {
-        controller = new Controller(inWidget, forWidget, isSubController, objectName, directions, size, constraints);
+        controller
+            = new Controller(inWidget, forWidget, isSubController, objectName, directions, size, constraints);
         controller->setTitle(title);
         addController(id, controller);
     } else if (controller != nullptr) {
@@ -95,7 +96,8 @@ QPointer<Controller> Manager::createController(int id, bool reuse, bool isSubCon
 }
 
 QPointer<Controller> Manager::createController(int id, bool reuse, bool isSubController, QWidget* inWidget,
-    const QString& title, const QString& objectName, const QSizeF& size, QFlags<Balloon::ESizeConstraint> constraints)
+    const QString& title, const QString& objectName, const QSizeF& size,
+    QFlags<Balloon::ESizeConstraint> constraints)
 {
     bool reused = false;
     QPointer<Controller> controller = reusedController(id, reuse, reused, objectName);
@@ -178,8 +180,8 @@ void Manager::onControllerDestroyed(Controller* controller)
         ZELKOV_LOG(vx::c_LogTrace, "vx::PopoverWidget::Manager::onControllerDestroyed",
             "controller " << id << " removed!");
     } else if (ids.isEmpty()) {
-        ZELKOV_LOG(vx::c_LogTrace, "vx::PopoverWidget::Manager::onControllerDestroyed",
-            "object to delete not in list!");
+        ZELKOV_LOG(
+            vx::c_LogTrace, "vx::PopoverWidget::Manager::onControllerDestroyed", "object to delete not in list!");
     } else {
         ZELKOV_LOG(
             vx::c_LogTrace, "vx::PopoverWidget::Manager::onControllerDestroyed", "multiple entries in list!");

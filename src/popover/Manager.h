@@ -25,9 +25,9 @@ namespace PopoverWidget
 class Container;
 class Item;
 
-/// Creates the controllers of popovers, finds them by an id that the client chooses, closes them singly or together
-/// and tells when popovers open and close. There is one in a process: call init() at the start of the application
-/// and deleteInstance() at its end.
+/// Creates the controllers of popovers, finds them by an id that the client chooses, closes them singly or
+/// together and tells when popovers open and close. There is one in a process: call init() at the start of the
+/// application and deleteInstance() at its end.
 ///
 /// The registry holds guarded pointers and owns no controller. An entry goes when its controller is destroyed.
 /// Several controllers may share an id; "the first" of them is the one entered last, as in any QMultiMap.
@@ -131,8 +131,8 @@ Q_SIGNALS:
     /// No popover is open any more. Comes after popoverDidClose(), whichever popover that was for.
     void lastPopoverDidClose();
     void lastModalPopoverDidClose();
-    /// After popoverWillClose() if nothing is open. A visible popover that begins to close still counts as open, so
-    /// that this does not come for an ordinary closing; clients rely on it.
+    /// After popoverWillClose() if nothing is open. A visible popover that begins to close still counts as open,
+    /// so that this does not come for an ordinary closing; clients rely on it.
     void lastPopoverWillClose();
     void lastModalPopoverWillClose();
     void popoverWillHelp(vx::TPopoverControllerPointer controller);

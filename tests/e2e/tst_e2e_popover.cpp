@@ -9,9 +9,9 @@
 #include <QtWidgets/QLineEdit>
 
 #include "../popover/PopoverScene.h"
+#include "popover/Manager.h"
 #include "TestCase.h"
 #include "TestMain.h"
-#include "popover/Manager.h"
 
 using vx::PopoverWidget::Manager;
 using zelkovtest::Balloon;
@@ -58,8 +58,7 @@ struct Window
 
     TestController* open(TestRow* row, int id, QWidget* at)
     {
-        TestController* const controller
-            = new TestController(window, at, Balloon::eadTop, QSizeF(140, 80));
+        TestController* const controller = new TestController(window, at, Balloon::eadTop, QSizeF(140, 80));
         controller->fader()->setFadingTimes(40, 40);
         Manager::instance()->addController(id, controller);
         TestContainer* const container = new TestContainer;
@@ -87,10 +86,7 @@ class TestE2ePopover : public zelkovtest::TestCase
         QCOMPARE(tool.exitCode(), 0);
     }
 
-    static QStringList words(const char* text)
-    {
-        return QString::fromLatin1(text).split(QLatin1Char(' '));
-    }
+    static QStringList words(const char* text) { return QString::fromLatin1(text).split(QLatin1Char(' ')); }
 
     static QStringList to(const QWidget* widget, const QPoint& position)
     {
@@ -102,7 +98,7 @@ class TestE2ePopover : public zelkovtest::TestCase
     // A drag from one point to another, with stops on the way for the other side to answer.
     static void drag(const QPoint& from, const QPoint& onto)
     {
-        QStringList steps{QStringLiteral("mousemove"), QString::number(from.x()), QString::number(from.y())};
+        QStringList steps {QStringLiteral("mousemove"), QString::number(from.x()), QString::number(from.y())};
         steps << words("sleep 0.1 mousedown 1 sleep 0.1");
         for (int i = 1; i <= 12; ++i) {
             const QPoint point = from + (onto - from) * i / 12;
@@ -224,12 +220,13 @@ private Q_SLOTS:
         Item* dropped = nullptr;
         int started = 0;
         connect(row, &Item::itemDragStarted, this, [&] { ++started; });
-        connect(controller, &Controller::itemDropped, this, [&](Item* item, QDropEvent* event, const QPoint& position) {
-            dropped = item;
-            ids << event->mimeData()->data(Item::sPopoverWidgetItem);
-            texts << event->mimeData()->data(QStringLiteral("text/plain"));
-            where = position;
-        });
+        connect(controller, &Controller::itemDropped, this,
+            [&](Item* item, QDropEvent* event, const QPoint& position) {
+                dropped = item;
+                ids << event->mimeData()->data(Item::sPopoverWidgetItem);
+                texts << event->mimeData()->data(QStringLiteral("text/plain"));
+                where = position;
+            });
         const QPoint onto = controller->mapToGlobal(QPoint(60, 340));
         drag(row->mapToGlobal(row->rect().center()), onto);
         QTRY_COMPARE(ids, QList<QByteArray>({"7"}));

@@ -39,13 +39,13 @@ public:
     TestController(QWidget* inWidget, QWidget* forWidget, int directions = Balloon::eadTop,
         const QSizeF& size = QSizeF(160, 120), int constraints = 3, bool isSubController = false)
         : Controller(inWidget, forWidget, isSubController, QStringLiteral("popover"),
-              QFlags<Balloon::EArrowDirection>(QFlag(directions)), size,
-              QFlags<Balloon::ESizeConstraint>(QFlag(constraints)))
+            QFlags<Balloon::EArrowDirection>(QFlag(directions)), size,
+            QFlags<Balloon::ESizeConstraint>(QFlag(constraints)))
     {
     }
     explicit TestController(QWidget* inWidget)
-        : Controller(inWidget, true, QStringLiteral("plain"), QSizeF(160, 120),
-              QFlags<Balloon::ESizeConstraint>(QFlag(3)))
+        : Controller(
+            inWidget, true, QStringLiteral("plain"), QSizeF(160, 120), QFlags<Balloon::ESizeConstraint>(QFlag(3)))
     {
     }
     using Controller::controllerRect;
@@ -91,10 +91,11 @@ public:
     /// A popover below the target, with one row, fades of 40 ms.
     TestController* build(int features = Balloon::ebfNoHeader, int containerFlags = 0)
     {
-        controller = new TestController(window, target);
+        TestController* const made = new TestController(window, target);
+        controller = made;
         controller->fader()->setFadingTimes(40, 40);
         fill(features, containerFlags);
-        return controller;
+        return made;
     }
 
     void makeContent(int containerFlags = 0)
@@ -149,7 +150,7 @@ public:
 
     QPointer<QWidget> window;
     QPointer<QPushButton> target;
-    QPointer<TestController> controller;
+    QPointer<Controller> controller;
     QPointer<TestContainer> container;
     QPointer<TestRow> row;
 

@@ -34,7 +34,8 @@ protected:
             return;
         }
         const QPointer<TestRow> self(this);
-        const QFlags<vx::PopoverWidget::EItemPerformedFlag> hit = getItemPerformedFlag(event->pos(), event->button());
+        const QFlags<vx::PopoverWidget::EItemPerformedFlag> hit
+            = getItemPerformedFlag(event->pos(), event->button());
         Q_EMIT itemPerformed(id(), value(), userData(), hit);
         if (self != nullptr) {
             QWidget::mouseReleaseEvent(event);

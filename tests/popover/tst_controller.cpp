@@ -205,7 +205,8 @@ private Q_SLOTS:
         controller->setMargins(1, 2, 3, 4);
         controller->adjustMargins(4, 3, 2, 1);
         QCOMPARE(controller->controllerRect(), QRect(16, 26, 348, 228));
-        QCOMPARE(recorder.names(), QStringList({QStringLiteral("marginsChanged"), QStringLiteral("marginsChanged")}));
+        QCOMPARE(
+            recorder.names(), QStringList({QStringLiteral("marginsChanged"), QStringLiteral("marginsChanged")}));
         QCOMPARE(recorder.entries().at(0).arguments, QVariantList({1, 2, 3, 4}));
         QCOMPARE(recorder.entries().at(1).arguments, QVariantList({5, 5, 5, 5}));
         int left = 0;
@@ -308,7 +309,8 @@ private Q_SLOTS:
         QCOMPARE(int(controller->balloon()->getFeatures()), 5);
     }
 
-    // --- Opening -------------------------------------------------------------------------------------------------
+    // --- Opening
+    // -------------------------------------------------------------------------------------------------
 
     void openingByFlags_data()
     {
@@ -420,12 +422,10 @@ private Q_SLOTS:
         QVERIFY(controller->isVisible());
     }
 
-    // --- Closing -------------------------------------------------------------------------------------------------
+    // --- Closing
+    // -------------------------------------------------------------------------------------------------
 
-    void closingByFlags_data()
-    {
-        openingByFlags_data();
-    }
+    void closingByFlags_data() { openingByFlags_data(); }
 
     void closingByFlags()
     {
@@ -602,7 +602,8 @@ private Q_SLOTS:
         QVERIFY(!controller->windowState().testFlag(Qt::WindowFullScreen));
     }
 
-    // --- Interruptions -------------------------------------------------------------------------------------------
+    // --- Interruptions
+    // -------------------------------------------------------------------------------------------
 
     void openingDuringTheFadeOutKeepsThePopover()
     {
@@ -612,7 +613,8 @@ private Q_SLOTS:
         controller->dismiss(true, false);
         SignalRecorder recorder(controller);
         controller->setActive();
-        QVERIFY(!QTest::qWaitFor([&] { return scene.controller == nullptr || !scene.controller->isVisible(); }, 150));
+        QVERIFY(
+            !QTest::qWaitFor([&] { return scene.controller == nullptr || !scene.controller->isVisible(); }, 150));
         QCOMPARE(recorder.count(QStringLiteral("popoverDidDisappear")), 0);
     }
 
@@ -656,7 +658,8 @@ private Q_SLOTS:
         QCOMPARE(scene.container->opened, 0);
     }
 
-    // --- What passes through -------------------------------------------------------------------------------------
+    // --- What passes through
+    // -------------------------------------------------------------------------------------
 
     void aPerformedItemIsReportedAndDismissesIfItShould()
     {

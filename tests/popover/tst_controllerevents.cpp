@@ -159,7 +159,8 @@ private Q_SLOTS:
         QVERIFY(!controller->isActive());
     }
 
-    // --- Keys ----------------------------------------------------------------------------------------------------
+    // --- Keys
+    // ----------------------------------------------------------------------------------------------------
 
     void escapeClosesWithoutAskingAndWithoutAnimation()
     {
@@ -225,7 +226,8 @@ private Q_SLOTS:
         QVERIFY(!controller->isActive());
     }
 
-    // --- Window and target ---------------------------------------------------------------------------------------
+    // --- Window and target
+    // ---------------------------------------------------------------------------------------
 
     void theOverlayFollowsTheWindow()
     {
@@ -240,7 +242,8 @@ private Q_SLOTS:
         scene.window->resize(500, 250);
         QCOMPARE(controller->geometry(), QRect(0, 0, 500, 250));
         // Once for the resize of the overlay itself, once for the window's.
-        QCOMPARE(recorder.names(), QStringList({QStringLiteral("layoutUpdated"), QStringLiteral("layoutUpdated")}));
+        QCOMPARE(
+            recorder.names(), QStringList({QStringLiteral("layoutUpdated"), QStringLiteral("layoutUpdated")}));
         controller->setActive(false, showFlags(1), false);
         recorder.clear();
         scene.window->resize(300, 200);
@@ -327,7 +330,8 @@ private Q_SLOTS:
         QVERIFY(!controller->eventFilter(scene.window, &move));
     }
 
-    // --- Drops ---------------------------------------------------------------------------------------------------
+    // --- Drops
+    // ---------------------------------------------------------------------------------------------------
 
     void dragsOfItemsAreAccepted_data()
     {
@@ -363,12 +367,13 @@ private Q_SLOTS:
         QPoint where;
         QDropEvent* seen = nullptr;
         int drops = 0;
-        connect(controller, &Controller::itemDropped, controller, [&](Item* item, QDropEvent* event, QPoint position) {
-            ++drops;
-            seen = event;
-            where = position;
-            QVERIFY(item == nullptr);
-        });
+        connect(
+            controller, &Controller::itemDropped, controller, [&](Item* item, QDropEvent* event, QPoint position) {
+                ++drops;
+                seen = event;
+                where = position;
+                QVERIFY(item == nullptr);
+            });
         QDropEvent drop(QPoint(5, 6), Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
         drop.setAccepted(false);
         static_cast<QObject*>(controller)->event(&drop);

@@ -59,16 +59,16 @@ private Q_SLOTS:
             const bool stays = (bits & 2) != 0;
             const bool closing = (bits & 4) != 0;
             const EKeyVerdict escape = !visible || stays ? EKeyVerdict::Reject
-                : closing                               ? EKeyVerdict::Ignore
-                                                        : EKeyVerdict::Dismiss;
+                : closing                                ? EKeyVerdict::Ignore
+                                                         : EKeyVerdict::Dismiss;
             const QByteArray name = QByteArray::number(bits, 2);
             QTest::newRow("escape " + name) << int(Qt::Key_Escape) << visible << stays << closing << escape;
-            QTest::newRow("return " + name) << int(Qt::Key_Return) << visible << stays << closing
-                                            << EKeyVerdict::Accept;
-            QTest::newRow("enter " + name) << int(Qt::Key_Enter) << visible << stays << closing
-                                           << EKeyVerdict::Accept;
-            QTest::newRow("space " + name) << int(Qt::Key_Space) << visible << stays << closing
-                                           << EKeyVerdict::NotOurs;
+            QTest::newRow("return " + name)
+                << int(Qt::Key_Return) << visible << stays << closing << EKeyVerdict::Accept;
+            QTest::newRow("enter " + name)
+                << int(Qt::Key_Enter) << visible << stays << closing << EKeyVerdict::Accept;
+            QTest::newRow("space " + name)
+                << int(Qt::Key_Space) << visible << stays << closing << EKeyVerdict::NotOurs;
         }
     }
 

@@ -92,7 +92,8 @@ private Q_SLOTS:
     void namesAndConstants()
     {
         QCOMPARE(Manager::sDefaultControllerID, 0);
-        QCOMPARE(QMetaType::typeName(qMetaTypeId<vx::TPopoverControllerPointer>()), "vx::TPopoverControllerPointer");
+        QCOMPARE(
+            QMetaType::typeName(qMetaTypeId<vx::TPopoverControllerPointer>()), "vx::TPopoverControllerPointer");
         QList<QByteArray> signalNames;
         QList<QByteArray> slotNames;
         const QMetaObject& meta = Manager::staticMetaObject;
@@ -165,8 +166,8 @@ private Q_SLOTS:
         again(other.target);
         QCOMPARE(controller->balloon()->forWidget(), static_cast<const QWidget*>(other.target));
         QVERIFY(!controller->isSubController());
-        const ControllerPointer plain = manager()->createController(7, true, true, scene.window, word("third title"),
-            word("third"), QSizeF(), QFlags<Balloon::ESizeConstraint>());
+        const ControllerPointer plain = manager()->createController(7, true, true, scene.window,
+            word("third title"), word("third"), QSizeF(), QFlags<Balloon::ESizeConstraint>());
         QCOMPARE(plain, controller);
         QCOMPARE(controller->objectName(), word("third"));
         QCOMPARE(controller->inWidget(), scene.window.data());
@@ -256,7 +257,8 @@ private Q_SLOTS:
         QCOMPARE(recorder.count(word("popoverWillOpen")), 1);
     }
 
-    // --- Removal -------------------------------------------------------------------------------------------------
+    // --- Removal
+    // -------------------------------------------------------------------------------------------------
 
     void aDestroyedControllerIsRemoved()
     {
@@ -307,7 +309,8 @@ private Q_SLOTS:
         QCOMPARE(log.messages(), QStringList());
     }
 
-    // --- What is open --------------------------------------------------------------------------------------------
+    // --- What is open
+    // --------------------------------------------------------------------------------------------
 
     void theCurrentPopoverIsTheOpenOneWithTheLowestId()
     {
@@ -361,17 +364,18 @@ private Q_SLOTS:
         QVERIFY(!manager()->anyModalPopoverOpen(scene.window));
     }
 
-    // --- All at once ---------------------------------------------------------------------------------------------
+    // --- All at once
+    // ---------------------------------------------------------------------------------------------
 
     void dismissAllTakesAllOrThoseOfAWindow_data()
     {
         QTest::addColumn<bool>("ofWindow");
         QTest::addColumn<bool>("modalOnly");
         QTest::addColumn<QList<bool>>("active");
-        QTest::newRow("all") << false << false << QList<bool>{false, false, false, false};
-        QTest::newRow("of a window") << true << false << QList<bool>{false, false, true, true};
-        QTest::newRow("modal") << false << true << QList<bool>{false, true, false, true};
-        QTest::newRow("modal of a window") << true << true << QList<bool>{false, true, true, true};
+        QTest::newRow("all") << false << false << QList<bool> {false, false, false, false};
+        QTest::newRow("of a window") << true << false << QList<bool> {false, false, true, true};
+        QTest::newRow("modal") << false << true << QList<bool> {false, true, false, true};
+        QTest::newRow("modal of a window") << true << true << QList<bool> {false, true, true, true};
     }
 
     void dismissAllTakesAllOrThoseOfAWindow()
@@ -446,8 +450,8 @@ private Q_SLOTS:
         manager()->adjustInsets(1, 2, -3, -4, scene.window);
         QCOMPARE(active->geometry(), QRect(QPoint(1, 2), QPoint(396, 295)));
         // Its own layout pass and the manager's, and one more for the size that changed.
-        QCOMPARE(recorder.names(),
-            QStringList({word("layoutUpdated"), word("layoutUpdated"), word("layoutUpdated")}));
+        QCOMPARE(
+            recorder.names(), QStringList({word("layoutUpdated"), word("layoutUpdated"), word("layoutUpdated")}));
         int left = 0;
         int top = 0;
         int right = 0;
@@ -458,7 +462,8 @@ private Q_SLOTS:
         QCOMPARE(left, 0);
     }
 
-    // --- Drops ---------------------------------------------------------------------------------------------------
+    // --- Drops
+    // ---------------------------------------------------------------------------------------------------
 
     void balloonsAreLiftedForADragAndPutBack()
     {
@@ -508,7 +513,8 @@ private Q_SLOTS:
         QVERIFY(balloon == nullptr);
     }
 
-    // --- Signals -------------------------------------------------------------------------------------------------
+    // --- Signals
+    // -------------------------------------------------------------------------------------------------
 
     void aModalPopoverIsToldOfTwice()
     {

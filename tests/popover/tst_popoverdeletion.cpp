@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// Everything that a popover is made of is deleted at the worst moments: inside each of its signals, in a fade, in a
-// loop. One row a case, for a sanitizer ends the process at its first finding. That the popover does not crash is all
-// that is asked.
+// Everything that a popover is made of is deleted at the worst moments: inside each of its signals, in a fade, in
+// a loop. One row a case, for a sanitizer ends the process at its first finding. That the popover does not crash
+// is all that is asked.
 #include "popover/Manager.h"
 
 #include <QtCore/QPropertyAnimation>
@@ -42,8 +42,8 @@ enum class Victim
 
 const QList<QPair<QByteArray, Victim>>& victims()
 {
-    static const QList<QPair<QByteArray, Victim>> all{{"controller", Victim::Controller}, {"target", Victim::Target},
-        {"window", Victim::Window}, {"items", Victim::Items}, {"row", Victim::Row},
+    static const QList<QPair<QByteArray, Victim>> all {{"controller", Victim::Controller},
+        {"target", Victim::Target}, {"window", Victim::Window}, {"items", Victim::Items}, {"row", Victim::Row},
         {"container", Victim::Container}, {"balloon", Victim::Balloon}, {"manager", Victim::Manager}};
     return all;
 }
@@ -55,7 +55,7 @@ struct Stage
     {
         Manager::init(0);
         scene.controller = new TestController(scene.window, scene.target);
-        Manager::instance()->addController(1, scene.controller.data());
+        Manager::instance()->addController(1, scene.controller);
         scene.makeContent(vx::PopoverWidget::ecfDismissAll);
         for (int i = 0; i < 12; ++i) {
             scene.container->addItem(new TestRow(100 + i));
@@ -125,7 +125,7 @@ struct Stage
     }
 
     // Each step only while what it needs is there.
-    void ifOpen(const std::function<void(TestController*)>& step) const
+    void ifOpen(const std::function<void(Controller*)>& step) const
     {
         if (scene.controller != nullptr && scene.controller->isVisible()) {
             step(scene.controller);
@@ -133,7 +133,7 @@ struct Stage
     }
     void clickButton(const char* name) const
     {
-        ifOpen([&](TestController* controller) {
+        ifOpen([&](Controller* controller) {
             if (controller->balloon() == nullptr) {
                 return;
             }
@@ -142,10 +142,7 @@ struct Stage
             }
         });
     }
-    static void settle(int ms = 0)
-    {
-        QTest::qWait(ms);
-    }
+    static void settle(int ms = 0) { QTest::qWait(ms); }
 
     // Uses the popover in every way, opened with these flags.
     void play(int flags, bool animated)
@@ -157,17 +154,17 @@ struct Stage
         scene.controller->setPersistence(true);
         scene.controller->setActive(true, showFlags(flags), animated);
         settle(wait);
-        ifOpen([](TestController* controller) { controller->setMargins(1, 2, 3, 4); });
-        ifOpen([](TestController* controller) { controller->adjustInsets(1, 1, -1, -1); });
+        ifOpen([](Controller* controller) { controller->setMargins(1, 2, 3, 4); });
+        ifOpen([](Controller* controller) { controller->adjustInsets(1, 1, -1, -1); });
         clickButton("popoverHelpButton");
-        ifOpen([](TestController* controller) { PopoverScene::releaseKey(controller, Qt::Key_Return); });
-        ifOpen([](TestController* controller) { controller->setStayVisible(true); });
-        ifOpen([](TestController* controller) { PopoverScene::releaseKey(controller, Qt::Key_Escape); });
-        ifOpen([](TestController* controller) { controller->setStayVisible(false); });
-        ifOpen([](TestController* controller) {
+        ifOpen([](Controller* controller) { PopoverScene::releaseKey(controller, Qt::Key_Return); });
+        ifOpen([](Controller* controller) { controller->setStayVisible(true); });
+        ifOpen([](Controller* controller) { PopoverScene::releaseKey(controller, Qt::Key_Escape); });
+        ifOpen([](Controller* controller) { controller->setStayVisible(false); });
+        ifOpen([](Controller* controller) {
             PopoverScene::drop(controller, QPoint(5, 5), Item::sPopoverWidgetItem);
         });
-        ifOpen([](TestController* controller) {
+        ifOpen([](Controller* controller) {
             if (controller->balloon() != nullptr && controller->getContainer() != nullptr) {
                 controller->balloon()->content()->verticalScrollBar()->triggerAction(
                     QAbstractSlider::SliderPageStepAdd);
@@ -181,7 +178,7 @@ struct Stage
         if (scene.row != nullptr && scene.row->isVisible()) {
             PopoverScene::click(scene.row, scene.row->rect().center());
         }
-        ifOpen([](TestController* controller) { PopoverScene::click(controller, QPoint(10, 290)); });
+        ifOpen([](Controller* controller) { PopoverScene::click(controller, QPoint(10, 290)); });
         settle(25);
         if (scene.controller != nullptr) {
             scene.controller->setActive(true, showFlags(flags), animated);
@@ -225,7 +222,7 @@ struct Stage
 // Signals that a play fires; controllerDestroyed() is the farewell of a controller that is dying already.
 const QList<QPair<QByteArray, QByteArrayList>>& signalTable()
 {
-    static const QList<QPair<QByteArray, QByteArrayList>> table{
+    static const QList<QPair<QByteArray, QByteArrayList>> table {
         {"controller",
             {"balloonOpened", "balloonClosed", "popoverWillAppear", "popoverDidAppear", "popoverWillDisappear",
                 "popoverDidDisappear", "popoverWillHelp", "shouldAccept", "shouldReject", "itemPerformed",
@@ -320,7 +317,7 @@ private Q_SLOTS:
         QFETCH(bool, opening);
         QFETCH(Victim, victim);
         Stage stage;
-        TestController* const controller = stage.scene.controller;
+        Controller* const controller = stage.scene.controller;
         stage.setTimes(100);
         controller->setPersistence(true);
         controller->setActive(true, showFlags(flags), opening);
@@ -386,13 +383,13 @@ private Q_SLOTS:
     {
         QFETCH(QByteArray, signal);
         Stage stage;
-        TestController* const outer = stage.scene.controller;
+        Controller* const outer = stage.scene.controller;
         outer->setActive();
         const QPointer<TestController> inner = new TestController(outer, outer->balloon());
         Manager::instance()->addController(2, inner.data());
         inner->setContainer(new TestContainer, QFlags<Balloon::EBalloonFeature>(QFlag(7)));
-        zelkovtest::Saboteur saboteur(inner, zelkovtest::signalIndex(inner, signal),
-            [&] { delete stage.scene.controller.data(); });
+        zelkovtest::Saboteur saboteur(
+            inner, zelkovtest::signalIndex(inner, signal), [&] { delete stage.scene.controller.data(); });
         inner->setActive();
         if (inner != nullptr) {
             inner->dismiss(false, false);

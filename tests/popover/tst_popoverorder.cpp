@@ -31,7 +31,7 @@ public:
         scene.controller = new TestController(scene.window, scene.target);
         scene.controller->fader()->setFadingTimes(40, 40);
         recorder.add(scene.controller);
-        Manager::instance()->addController(id, scene.controller.data());
+        Manager::instance()->addController(id, scene.controller);
         scene.makeContent(containerFlags);
         recorder.add(scene.container);
         scene.controller->setContainer(scene.container, QFlags<Balloon::EBalloonFeature>(QFlag(7)));
@@ -111,10 +111,10 @@ private Q_SLOTS:
         QTest::addColumn<QByteArray>("later");
         const QByteArray atOnce = join({c_opened, c_laidOut, c_appeared, "controller.balloonOpened"});
         const QByteArray fading = join({c_opened, c_laidOut, "controller.balloonOpened"});
-        const QByteArray growing = join({c_opened, c_laidOut, c_appeared, "controller.layoutUpdated ",
-            "controller.balloonOpened"});
-        const QByteArray growingAndFading = join({c_opened, c_laidOut, "controller.layoutUpdated ",
-            "controller.balloonOpened"});
+        const QByteArray growing
+            = join({c_opened, c_laidOut, c_appeared, "controller.layoutUpdated ", "controller.balloonOpened"});
+        const QByteArray growingAndFading
+            = join({c_opened, c_laidOut, "controller.layoutUpdated ", "controller.balloonOpened"});
         const QByteArray grown = join({"controller.layoutUpdated ", c_appeared});
         for (const bool mouse : {false, true}) {
             const int more = mouse ? 8 : 0;
@@ -215,7 +215,8 @@ private Q_SLOTS:
         popover.take();
         scene.controller->dismiss(true, false);
         QTRY_VERIFY(scene.controller == nullptr);
-        QCOMPARE(popover.take(), list(join({c_aboutToClose, c_closing, c_gone, "controller.controllerDestroyed"})));
+        QCOMPARE(
+            popover.take(), list(join({c_aboutToClose, c_closing, c_gone, "controller.controllerDestroyed"})));
     }
 
     void aDismissingRowClosesBeforeTheClientHearsOfIt()
@@ -355,8 +356,8 @@ private Q_SLOTS:
         scene.window->resize(500, 400);
         QCOMPARE(popover.take(), list("controller.layoutUpdated controller.layoutUpdated"));
         scene.controller->setMargins(1, 1, 1, 1);
-        QCOMPARE(popover.take(),
-            list("controller.marginsChanged controller.layoutUpdated controller.layoutUpdated"));
+        QCOMPARE(
+            popover.take(), list("controller.marginsChanged controller.layoutUpdated controller.layoutUpdated"));
     }
 
     void twoPopoversAndDismissAll()
@@ -364,7 +365,7 @@ private Q_SLOTS:
         PopoverScene scene;
         SignalRecorder recorder(Manager::instance());
         RecordedPopover first(scene, recorder, 1);
-        const QPointer<TestController> lower = scene.controller;
+        const QPointer<Controller> lower = scene.controller;
         lower->setActive();
         RecordedPopover second(scene, recorder, 2);
         first.add(scene.controller, "second");

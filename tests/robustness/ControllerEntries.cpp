@@ -9,10 +9,10 @@
 #include <QtWidgets/QPushButton>
 
 #include "../popover/TestRow.h"
-#include "Registry.h"
 #include "popover/Balloon.h"
 #include "popover/Container.h"
 #include "popover/Controller.h"
+#include "Registry.h"
 
 namespace zelkovtest
 {
@@ -86,12 +86,12 @@ Entry controllerEntry()
     entry.kind = Kind::Widget;
     entry.create = [](QWidget* host) {
         Controller* const controller = popoverOfManager(host);
-        return Subject{controller, controller};
+        return Subject {controller, controller};
     };
     const Step performSecond = [](const Subject& subject) {
         Item* const row = controllerOf(subject)->getContainer()->getItem(2);
-        QMouseEvent event(QEvent::MouseButtonRelease, row->rect().center(), Qt::LeftButton, Qt::NoButton,
-            Qt::NoModifier);
+        QMouseEvent event(
+            QEvent::MouseButtonRelease, row->rect().center(), Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
         QApplication::sendEvent(row, &event);
     };
     const Step dropItem = [](const Subject& subject) {
@@ -153,12 +153,12 @@ Entry managerEntry()
     entry.create = [](QWidget* host) {
         Controller* const controller = popoverOfManager(host);
         Manager::instance()->registerAcceptedDropMimeType(1001, QStringLiteral("3"));
-        return Subject{Manager::instance(), controller};
+        return Subject {Manager::instance(), controller};
     };
     entry.exercise = {
         {"open and dismiss",
-            {"popoverWillOpen", "modalPopoverWillOpen", "popoverDidOpen", "modalPopoverDidOpen", "popoverWillClose",
-                "popoverDidClose", "lastPopoverDidClose", "lastModalPopoverDidClose"},
+            {"popoverWillOpen", "modalPopoverWillOpen", "popoverDidOpen", "modalPopoverDidOpen",
+                "popoverWillClose", "popoverDidClose", "lastPopoverDidClose", "lastModalPopoverDidClose"},
             {openPopover(5, true), dismissPopover(false)}},
         // Only an overlay that is hidden already makes room for the last signals of this kind.
         {"dismiss what is hidden", {"lastPopoverWillClose", "lastModalPopoverWillClose"},
