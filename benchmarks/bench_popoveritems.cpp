@@ -20,7 +20,8 @@ class Row : public pw::Item
 {
 public:
     explicit Row(int id)
-        : Item(nullptr, pw::eifText, id, QStringLiteral("row%1").arg(id), QStringLiteral("Camera %1").arg(id), QString())
+        : Item(nullptr, pw::eifText, id, QStringLiteral("row%1").arg(id), QStringLiteral("Camera %1").arg(id),
+            QString())
     {
     }
 };
@@ -57,7 +58,7 @@ private:
     pw::Container* m_header = create();
     pw::Container* m_footer = create();
     pw::Container* m_nested = create();
-    pw::Container m_box{nullptr, QString(), Qt::Vertical, Qt::AlignTop};
+    pw::Container m_box {nullptr, QString(), Qt::Vertical, Qt::AlignTop};
     std::vector<int> m_ids; // in the order of the walk
 };
 

@@ -29,8 +29,8 @@ void connectOnce(const QObject* sender, const char* signal, const QObject* recei
 }
 }
 
-Container::Container(QWidget* parent, const QString& objectName, Qt::Orientation orientation,
-    QFlags<Qt::AlignmentFlag> alignment)
+Container::Container(
+    QWidget* parent, const QString& objectName, Qt::Orientation orientation, QFlags<Qt::AlignmentFlag> alignment)
     : QWidget(parent)
     , m_orientation(orientation)
 {

@@ -21,8 +21,8 @@ namespace PopoverWidget
 class Item;
 
 /// A box of items, in a column or a row, with an optional header and footer and with nested containers. It finds
-/// items by id, user data or value in all its parts, hands their itemPerformed() on, dismisses the popover for those
-/// that want it, and tells the balloon when the layout changed.
+/// items by id, user data or value in all its parts, hands their itemPerformed() on, dismisses the popover for
+/// those that want it, and tells the balloon when the layout changed.
 ///
 /// Fill it and give it to Controller::setContainer(), which puts it into a scroll area that owns it from then on.
 /// Header and footer are not laid out by the container: the balloon places those that exist at that moment. Until
@@ -33,8 +33,8 @@ class Item;
 /// signal, and a getter give an empty value.
 ///
 /// Where the last argument of an operation is called @p emitSignal, true means: emit layoutChanged() if the
-/// container is visible. The adding operations do so by themselves. layoutChanged() of an item comes one turn of the
-/// event loop later.
+/// container is visible. The adding operations do so by themselves. layoutChanged() of an item comes one turn of
+/// the event loop later.
 class ZELKOV_WIDGETS_EXPORT Container : public QWidget
 {
     Q_OBJECT
@@ -179,8 +179,8 @@ Q_SIGNALS:
     void layoutChanged();
     void dismissPopover();
     void dismissAllPopover();
-    void itemPerformed(int itemId, const QVariant& value, const QVariant& userData,
-        vx::PopoverWidget::EItemPerformedFlags flag);
+    void itemPerformed(
+        int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
     void popoverAboutToClose();
     void popoverAboutToOpen();
 
@@ -210,12 +210,9 @@ protected:
     int m_autoFocusItem = -1;
 
 private:
-    template<class Visitor>
-    bool walk(bool intoNoForward, const Visitor& visitor) const;
-    template<class Change>
-    void changeItem(Item* item, bool emitSignal, const Change& change);
-    template<class Change>
-    void changeItems(int id, bool emitSignal, const Change& change);
+    template <class Visitor> bool walk(bool intoNoForward, const Visitor& visitor) const;
+    template <class Change> void changeItem(Item* item, bool emitSignal, const Change& change);
+    template <class Change> void changeItems(int id, bool emitSignal, const Change& change);
     bool dropPart(QPointer<Container>& part, bool deleteItems);
     void dropItems(bool deleteItems);
 };

@@ -2,8 +2,8 @@
 // The content of a popover: finding its items and changing them by id.
 #include "popover/Container.h"
 
-#include "popover/Item.h"
 #include "popover/ContainerLinks.h"
+#include "popover/Item.h"
 
 #include <QtWidgets/QBoxLayout>
 
@@ -13,8 +13,7 @@ namespace PopoverWidget
 {
 
 /// Calls visitor(item) for the whole tree until it returns true.
-template<class Visitor>
-bool Container::walk(bool intoNoForward, const Visitor& visitor) const
+template <class Visitor> bool Container::walk(bool intoNoForward, const Visitor& visitor) const
 {
     for (const QPointer<Item>& item : m_items) {
         if (!item) {
@@ -45,8 +44,7 @@ bool Container::walk(bool intoNoForward, const Visitor& visitor) const
 }
 
 /// Changes one item; null means that there is none.
-template<class Change>
-void Container::changeItem(Item* item, bool emitSignal, const Change& change)
+template <class Change> void Container::changeItem(Item* item, bool emitSignal, const Change& change)
 {
     if (!item) {
         return;
@@ -59,8 +57,7 @@ void Container::changeItem(Item* item, bool emitSignal, const Change& change)
 }
 
 /// Changes all items of the tree with that id.
-template<class Change>
-void Container::changeItems(int id, bool emitSignal, const Change& change)
+template <class Change> void Container::changeItems(int id, bool emitSignal, const Change& change)
 {
     QList<QPointer<Item>> found;
     walk(false, [id, &found](Item* item) {

@@ -11,8 +11,8 @@ namespace vx
 namespace PopoverWidget
 {
 
-HeaderContainer::HeaderContainer(QWidget* parent, const QString& objectName, Qt::Orientation orientation,
-    QFlags<Qt::AlignmentFlag> alignment)
+HeaderContainer::HeaderContainer(
+    QWidget* parent, const QString& objectName, Qt::Orientation orientation, QFlags<Qt::AlignmentFlag> alignment)
     : Container(parent, objectName, orientation, alignment)
 {
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Preferred);
@@ -68,17 +68,17 @@ void HeaderContainer::resetLayout(bool deleteItems, bool withHeaderAndFooter)
     while (QLayoutItem* const entry = m_layout->takeAt(0)) {
         delete entry;
     }
-    if (deleteItems) {
-        // With an empty layout only every second item is deleted. The rest is kept, out of sight.
-        const QList<Item*> all = items();
-        for (int i = 0; i < all.size(); i += 2) {
-            Item* const item = all.at(i);
-            if (!item->parent()) {
-                item->setParent(this);
-            }
-            if (item->parent() == this) {
-                item->hide();
-            }
+    // With an empty layout only every second item is deleted. The rest is kept, out of sight.
+    const QList<Item*> all = items();
+    for (int i = 0; i < all.size(); ++i) {
+        Item* const item = all.at(i);
+        const bool kept = !deleteItems || i % 2 == 0;
+        if (kept && !item->parent()) {
+            // The item of a widget; nobody else knows it.
+            item->setParent(this);
+            item->hide();
+        } else if (kept && deleteItems && item->parent() == this) {
+            item->hide();
         }
     }
     Container::resetLayout(deleteItems, withHeaderAndFooter);

@@ -29,8 +29,8 @@ public:
     Item* insertItem(Item* item, int index) override;
     /// Lays the widget itself out; the WidgetItem that is found in its place is never shown.
     void insertWidgetItem(QWidget* widget, int index, const QString& objectName, int id) override;
-    /// Empties the layout, spacers included, and the list of items. With @p deleteItems only every second item, from
-    /// the second on, is deleted; the others stay behind as hidden children. Odd on purpose.
+    /// Empties the layout, spacers included, and the list of items. With @p deleteItems only every second item,
+    /// from the second on, is deleted; the others stay behind as hidden children. Odd on purpose.
     void resetLayout(bool deleteItems, bool withHeaderAndFooter) override;
 };
 

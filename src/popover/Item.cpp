@@ -261,7 +261,8 @@ void Item::onItemScrolled()
 QFlags<EItemPerformedFlag> Item::getItemPerformedFlag(const QPoint& pos, Qt::MouseButton button)
 {
     return ItemRules::hit(
-        {elementRect(m_iconElement), elementRect(m_textElement), elementRect(m_additionalTextElement)}, pos, button);
+        {elementRect(m_iconElement), elementRect(m_textElement), elementRect(m_additionalTextElement)}, pos,
+        button);
 }
 
 void Item::performSingleClick(QFlags<EItemPerformedFlag> flags)
@@ -492,7 +493,8 @@ void Item::mousePressEvent(QMouseEvent* event)
 void Item::mouseMoveEvent(QMouseEvent* event)
 {
     if (!m_dragEnabled
-        || !ItemRules::startsDrag(event->buttons(), m_dragStart, event->pos(), QApplication::startDragDistance())) {
+        || !ItemRules::startsDrag(
+            event->buttons(), m_dragStart, event->pos(), QApplication::startDragDistance())) {
         QWidget::mouseMoveEvent(event);
         return;
     }

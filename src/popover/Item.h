@@ -28,14 +28,14 @@ namespace PopoverWidget
 {
 
 /// One row of a popover: up to three elements (icon, text, additional text), a busy mark, an id, and the rules by
-/// which a click becomes itemPerformed(). Subclasses add a control at the right end and react to the mouse release;
-/// the base class reacts to double clicks, drags and the state alone. A Container lays rows out, owns them and hands
-/// itemPerformed() on.
+/// which a click becomes itemPerformed(). Subclasses add a control at the right end and react to the mouse
+/// release; the base class reacts to double clicks, drags and the state alone. A Container lays rows out, owns
+/// them and hands itemPerformed() on.
 ///
-/// Elements are created by the constructor as its flags say, never later: a setter for an element that the item does
-/// not have does nothing, and its getter gives an empty value. Icon and text stand at the left, the additional text
-/// at the right; with flags 0 the item has no element and no left and right layout, only a main layout for the
-/// subclass. Elements do not take the mouse, the item does.
+/// Elements are created by the constructor as its flags say, never later: a setter for an element that the item
+/// does not have does nothing, and its getter gives an empty value. Icon and text stand at the left, the
+/// additional text at the right; with flags 0 the item has no element and no left and right layout, only a main
+/// layout for the subclass. Elements do not take the mouse, the item does.
 ///
 /// The base class has no say in what a click means. A subclass asks, in its mouseReleaseEvent(): isProtected(), is
 /// the position in rect(), is the button one that performs; then emits itemPerformed() with what
@@ -81,8 +81,8 @@ public:
     /// Shows or hides the busy mark, with @p hideLast in place of the last element. Ending it shows that element
     /// again in any case. Emits layoutChanged().
     virtual void setBusy(bool busy, bool hideLast);
-    /// Puts a text in place of the busy mark, for instance a count; an empty text hides it. Without @p hideLast the
-    /// last element is shown beside it. Emits layoutChanged().
+    /// Puts a text in place of the busy mark, for instance a count; an empty text hides it. Without @p hideLast
+    /// the last element is shown beside it. Emits layoutChanged().
     virtual void setBusyText(const QString& text, bool hideLast);
     /// The widget that takes the focus for the item, or null.
     virtual QWidget* getFocusItem();
@@ -149,8 +149,8 @@ Q_SIGNALS:
     /// The item may want another size.
     void layoutChanged();
     /// The user performed the item. @p value is what the subclass has as value at that moment.
-    void itemPerformed(int itemId, const QVariant& value, const QVariant& userData,
-        vx::PopoverWidget::EItemPerformedFlags flag);
+    void itemPerformed(
+        int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
     /// A drag of the item is about to begin. The drag runs in a local event loop right after this.
     void itemDragStarted();
     // The signals of the context menu come next.
@@ -166,8 +166,8 @@ protected:
     bool isProtected();
     /// With eifBoldSelection: the font of the text element after isChecked().
     void updateSelectionDrawing();
-    /// Calls performSingleClick(@p flags) when no second click has come in the system's double click interval and 50
-    /// milliseconds. The release that ends a double click starts nothing.
+    /// Calls performSingleClick(@p flags) when no second click has come in the system's double click interval and
+    /// 50 milliseconds. The release that ends a double click starts nothing.
     void startDoubleClickTimer(QFlags<EItemPerformedFlag> flags);
     void stopDoubleClickTimer();
     /// performSingleClick() with eipDoubleClick added.

@@ -16,8 +16,8 @@ namespace
 /// Relative to the size of what is dragged.
 constexpr double c_HotSpot = 0.5;
 
-/// Ends a drag whose item has died. The end has to wait for the event loop, since the item may well die in an answer
-/// to the drag; until then nobody is offered an item that no longer exists.
+/// Ends a drag whose item has died. The end has to wait for the event loop, since the item may well die in an
+/// answer to the drag; until then nobody is offered an item that no longer exists.
 class DragEnd : public QObject
 {
 public:

@@ -98,7 +98,7 @@ private Q_SLOTS:
     void marginsAndSpacingAreTheLayouts()
     {
         Box box;
-        const QList<QByteArray> names{"spacing", "leftMargin", "topMargin", "rightMargin", "bottomMargin"};
+        const QList<QByteArray> names {"spacing", "leftMargin", "topMargin", "rightMargin", "bottomMargin"};
         for (int i = 0; i < names.size(); ++i) {
             QVERIFY(box.setProperty(names.at(i), 11 + i));
             QCOMPARE(box.property(names.at(i)).toInt(), 11 + i);
@@ -258,7 +258,7 @@ private Q_SLOTS:
     void nestedContainersAreHeardButDoNotDismiss()
     {
         Box box;
-        QList<Box*> parts{new Box, new Box, new Box};
+        QList<Box*> parts {new Box, new Box, new Box};
         box.addHeader(parts.at(0));
         box.addFooter(parts.at(1));
         box.addContainer(parts.at(2));
@@ -640,7 +640,7 @@ private Q_SLOTS:
         connect(box.data(), &Container::popoverAboutToOpen, this, gone);
         // Straight from the item, in the middle of the container's work.
         connect(box->getItem(1), &Item::layoutChanged, this, gone);
-        const QList<std::function<void()>> operations{
+        const QList<std::function<void()>> operations {
             [&] { box->addItem(new Row); },
             [&] { box->addItem(new Row, pw::ecfDismiss); },
             [&] { box->addStretch(1); },
@@ -653,7 +653,9 @@ private Q_SLOTS:
             [&] { box->setItemValue(1, text("x"), true); },
             [&] { box->setItemBusy(1, true, true, true); },
             [&] { box->setItemVisibility(1, false, true); },
-            [&] { box->setItemVisibility(QList<int>({1, 1}), false, true); },
+            [&] {
+                box->setItemVisibility(QList<int>({1, 1}), false, true);
+            },
             [&] { box->setItemEnabled(1, false, true); },
             [&] { box->setItemsChecked(1, true, true); },
             [&] { box->setItemsVisibility(1, false, true); },

@@ -63,8 +63,8 @@ struct Tree
     QScopedPointer<Container> top;
     Container* nested;
     // In the order of the walk.
-    QVector<Row*> rows{nullptr, createRow(1, 7, 70), createRow(2, 8, 70), createRow(1, 7, 71), createRow(4, 7, 70),
-        createRow(1, 7, 70), createRow(6, 7, 72)};
+    QVector<Row*> rows {nullptr, createRow(1, 7, 70), createRow(2, 8, 70), createRow(1, 7, 71),
+        createRow(4, 7, 70), createRow(1, 7, 70), createRow(6, 7, 72)};
 };
 
 QList<Item*> items(const QList<Row*>& rows)
@@ -136,7 +136,7 @@ private Q_SLOTS:
         QRandomGenerator random(seed);
         for (int round = 0; round < 60; ++round) {
             QScopedPointer<Container> top(createBox());
-            QList<Container*> all{top.data()};
+            QList<Container*> all {top.data()};
             for (int i = 0; i < 12; ++i) {
                 Container* const box = all.at(random.bounded(all.size()));
                 Container* const part = createBox();
@@ -288,7 +288,7 @@ private Q_SLOTS:
     void changesAreAnnouncedOnRequestWhileVisible_data()
     {
         QTest::addColumn<int>("operation");
-        const QList<QByteArray> names{"text", "current text", "value", "busy", "visibility", "enabled", "enable",
+        const QList<QByteArray> names {"text", "current text", "value", "busy", "visibility", "enabled", "enable",
             "all checked", "all enabled", "all visible"};
         for (int i = 0; i < names.size(); ++i) {
             QTest::newRow(names.at(i).constData()) << i;

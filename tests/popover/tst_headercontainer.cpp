@@ -165,6 +165,19 @@ private Q_SLOTS:
         QCOMPARE(header.layout()->count(), 0);
     }
 
+    void theItemsOfWidgetsGoWithTheHeaderThatDroppedThem()
+    {
+        Container box(nullptr, QString(), Qt::Vertical, Qt::AlignTop);
+        auto* const header = new Header;
+        header->addWidgetItem(new QLineEdit, QString(), 1);
+        QPointer<Item> item = header->getItem(1);
+        box.addHeader(header);
+        header->resetLayout(false, false);
+        QVERIFY(item && item->isHidden());
+        box.resetLayout(false, true);
+        QVERIFY(!item);
+    }
+
     void theItemsOfWidgetsAreNotLost()
     {
         QPointer<Item> first;

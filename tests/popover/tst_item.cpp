@@ -498,7 +498,8 @@ private Q_SLOTS:
         rights->m_asked.clear();
         QMouseEvent move(QEvent::MouseMove, QPoint(5, 5), Qt::NoButton, Qt::NoButton, Qt::NoModifier);
         QVERIFY(!row.eventFilter(&control, &move));
-        QMouseEvent twice(QEvent::MouseButtonDblClick, QPoint(5, 5), Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
+        QMouseEvent twice(
+            QEvent::MouseButtonDblClick, QPoint(5, 5), Qt::LeftButton, Qt::LeftButton, Qt::NoModifier);
         QVERIFY(!row.eventFilter(&control, &twice));
         QCOMPARE(rights->m_asked, QStringList());
         Item::setSecurityManager(nullptr);

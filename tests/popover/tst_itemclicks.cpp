@@ -36,8 +36,7 @@ QList<int> performedFlags(const QSignalSpy& spy)
 }
 
 /// A row inside a window, 200 x 24 at (20, 10).
-template<class Class>
-struct Scene
+template <class Class> struct Scene
 {
     explicit Scene(QFlags<pw::EItemFlag> flags)
     {
@@ -261,7 +260,7 @@ private Q_SLOTS:
         QFETCH(int, flags);
         QFETCH(bool, twice);
         QApplication::setDoubleClickInterval(100);
-        Scene<ClickRow> scene{pw::EItemFlags(QFlag(flags))};
+        Scene<ClickRow> scene {pw::EItemFlags(QFlag(flags))};
         connect(scene.row.data(), &Item::itemPerformed, this, [&scene] { delete scene.row.data(); });
         Pointer pointer(&scene.host);
         pointer.click(QPoint(120, 22));

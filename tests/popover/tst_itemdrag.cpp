@@ -1,13 +1,12 @@
 // SPDX-License-Identifier: MIT
 // A row is dragged: when, with what, and where to. The drags are real.
+#include "DragTools.h"
 #include "ItemTools.h"
 
-#include "support/Pointer.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
 
 #include <QtCore/QMimeData>
-#include <QtCore/QTimer>
 #include <QtGui/QDrag>
 #include <QtGui/QDropEvent>
 #include <QtTest/QtTest>
@@ -18,7 +17,6 @@
 using itemtest::Row;
 using vx::PopoverWidget::Item;
 namespace pw = vx::PopoverWidget;
-using zelkovtest::Pointer;
 
 namespace
 {
@@ -96,42 +94,9 @@ struct Scene
     QPointer<Row> row;
     QPointer<Target> target;
 
-    /// Presses on the row and drags it to the target. What is queued by @p during runs in the drag's own loop.
     void drag(const std::function<void()>& during = {})
     {
-        Pointer pointer(host);
-        pointer.move(QPoint(20, 20));
-        pointer.press();
-        QTimer patience;
-        QObject::connect(&patience, &QTimer::timeout, &patience, [] { QDrag::cancel(); });
-        patience.start(5000);
-        // Each step schedules the next one before it runs.
-        QTimer::singleShot(0, host, [&] {
-            QTimer::singleShot(0, host, [&] {
-                QTimer::singleShot(0, host, [&] {
-                    if (host) {
-                        pointer.release();
-                    }
-                });
-                pointer.move(QPoint(61, 131));
-            });
-            if (during) {
-                during();
-            }
-            pointer.move(QPoint(60, 130));
-        });
-        pointer.move(QPoint(40, 20));
-        if (!host) {
-            // The button goes up over another window.
-            QWidget other;
-            other.show();
-            static_cast<void>(QTest::qWaitForWindowExposed(&other));
-            qt_handleMouseEvent(other.windowHandle(), QPointF(5, 5), QPointF(5, 5), Qt::NoButton, Qt::LeftButton,
-                QEvent::MouseButtonRelease, Qt::NoModifier, 20000);
-            QCoreApplication::processEvents();
-        }
-        // Without a drag the steps still wait.
-        QTRY_COMPARE(QGuiApplication::mouseButtons(), Qt::MouseButtons(Qt::NoButton));
+        itemtest::drag(host, QPoint(20, 20), QPoint(60, 130), during);
     }
 };
 }

@@ -40,7 +40,7 @@ private Q_SLOTS:
         QFETCH(QPoint, position);
         QFETCH(int, button);
         QFETCH(int, flags);
-        const rules::Elements elements{QRect(10, 5, 20, 10), QRect(25, 5, 40, 10), QRect(60, 5, 40, 10)};
+        const rules::Elements elements {QRect(10, 5, 20, 10), QRect(25, 5, 40, 10), QRect(60, 5, 40, 10)};
         QCOMPARE(int(rules::hit(elements, position, static_cast<Qt::MouseButton>(button))), flags);
     }
 
@@ -60,7 +60,7 @@ private Q_SLOTS:
             return QRect(random.bounded(-20, 20), random.bounded(-20, 20), random.bounded(30), random.bounded(30));
         };
         for (int i = 0; i < 5000; ++i) {
-            const rules::Elements elements{rectangle(), rectangle(), rectangle()};
+            const rules::Elements elements {rectangle(), rectangle(), rectangle()};
             const QPoint position(random.bounded(-30, 40), random.bounded(-30, 40));
             const auto flags = rules::hit(elements, position, Qt::LeftButton);
             const int part = int(flags) & 15;

@@ -21,7 +21,8 @@ class ExercisedRow : public pw::Item
 {
 public:
     explicit ExercisedRow(QWidget* parent)
-        : Item(parent, pw::eifIcon | pw::eifText | pw::eifAdditionalText | pw::eifDoubleClick | pw::eifBoldSelection, 1,
+        : Item(parent,
+            pw::eifIcon | pw::eifText | pw::eifAdditionalText | pw::eifDoubleClick | pw::eifBoldSelection, 1,
             QStringLiteral("row"), QStringLiteral("Pan & tilt"), QStringLiteral("on"))
     {
         resize(160, 24);
@@ -38,7 +39,7 @@ Entry popoverItem()
     entry.kind = Kind::Widget;
     entry.create = [](QWidget* host) {
         auto* const row = new ExercisedRow(host);
-        return Subject{row, row};
+        return Subject {row, row};
     };
     entry.exercise = {
         {"double click", {"itemPerformed"},
@@ -81,7 +82,7 @@ Entry popoverWidgetItem()
     entry.create = [](QWidget* host) {
         auto* const item = new pw::WidgetItem(new QLineEdit, QStringLiteral("holder"), 1, host);
         item->setDragEnabled(true);
-        return Subject{item, item};
+        return Subject {item, item};
     };
     entry.exercise = {
         {"as a bare row", {"itemPerformed", "layoutChanged"},
@@ -130,8 +131,7 @@ Step addParts()
     };
 }
 
-template<class Class>
-Entry popoverContainer(const char* name, const char* header)
+template <class Class> Entry popoverContainer(const char* name, const char* header)
 {
     Entry entry;
     entry.name = name;
@@ -142,7 +142,7 @@ Entry popoverContainer(const char* name, const char* header)
         container->resize(200, 200);
         container->addItem(new ExercisedRow(nullptr), pw::ecfDismiss | pw::ecfDismissAll);
         container->addItem(new ExercisedRow(nullptr));
-        return Subject{container, container};
+        return Subject {container, container};
     };
     entry.exercise = {
         {"performing a row", {"dismissPopover", "dismissAllPopover", "itemPerformed"}, {performRow(1)}},
@@ -160,7 +160,8 @@ Entry popoverContainer(const char* name, const char* header)
                 call(&pw::Container::setItemBusy, 1, true, true, true),
                 call(&pw::Container::setItemsChecked, 1, true, true),
                 call(&pw::Container::setItemsVisibility, 1, false, true)}},
-        {"emptying", {}, {call(&pw::Container::removeItem, 1), addRow(pw::ecfDismiss), call(&pw::Container::clear)}},
+        {"emptying", {},
+            {call(&pw::Container::removeItem, 1), addRow(pw::ecfDismiss), call(&pw::Container::clear)}},
     };
     using Visibility = void (pw::Container::*)(int, bool, bool);
     entry.setters = {
