@@ -91,7 +91,7 @@ double median(std::vector<double> values)
 }
 
 // Runs both in turns until the benchmark has enough, and reports their medians and the ratio.
-template<class Ours, class Theirs>
+template <class Ours, class Theirs>
 void besideEachOther(benchmark::State& state, int repetitions, const Ours& ours, const Theirs& theirs)
 {
     ours();
@@ -148,7 +148,13 @@ void buildShowDestroy(benchmark::State& state)
             settle();
         });
 }
-BENCHMARK(buildShowDestroy)->Arg(10)->Arg(100)->Arg(1000)->UseManualTime()->MinTime(1)->Unit(benchmark::kMillisecond);
+BENCHMARK(buildShowDestroy)
+    ->Arg(10)
+    ->Arg(100)
+    ->Arg(1000)
+    ->UseManualTime()
+    ->MinTime(1)
+    ->Unit(benchmark::kMillisecond);
 
 void reopen(benchmark::State& state)
 {
@@ -214,11 +220,10 @@ void geometry(benchmark::State& state)
         const QRect target(x, 120, 40, 20);
         const int side = preferredSide(parent, target, target.topLeft(), 15);
         const QPointF anchor = anchorPoint(target, QPointF(-1, 0), side, target.topLeft());
-        const QSize size = sizeFromContent(
-            contentSize(QSize(180, 240), QSize(0, 0), QSize(16777215, 16777215)), side, 4, 15, 0,
-            {Strip{true, QSize(120, 24)}, Strip(), Strip()});
-        const QRect rect = toRect(
-            frame(limits(QRectF(parent), QMargins(4, 4, 4, 4)), QSizeF(size), anchor, side, 4));
+        const QSize size = sizeFromContent(contentSize(QSize(180, 240), QSize(0, 0), QSize(16777215, 16777215)),
+            side, 4, 15, 0, {Strip {true, QSize(120, 24)}, Strip(), Strip()});
+        const QRect rect
+            = toRect(frame(limits(QRectF(parent), QMargins(4, 4, 4, 4)), QSizeF(size), anchor, side, 4));
         const QPointF tip = anchor - rect.topLeft();
         const QRectF inner = innerRect(QRectF(0, 0, rect.width(), rect.height()), side, 15);
         benchmark::DoNotOptimize(outline(inner, 6, arrowDrawn(15, inner, tip), 15, side, tip));
@@ -232,7 +237,8 @@ int main(int argc, char** argv)
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) {
         qputenv("QT_QPA_PLATFORM", "offscreen");
     }
-    qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString&) {}); // the offscreen plugin chats
+    qInstallMessageHandler(
+        [](QtMsgType, const QMessageLogContext&, const QString&) {}); // the offscreen plugin chats
     QApplication application(argc, argv);
     Manager::init(1000);
     benchmark::Initialize(&argc, argv);

@@ -37,9 +37,10 @@ class TextRow : public Item
 {
 public:
     TextRow(int id, const QString& text, const QString& note)
-        : Item(nullptr, note.isEmpty() ? vx::PopoverWidget::eifText
-                                       : vx::PopoverWidget::eifText | vx::PopoverWidget::eifAdditionalText,
-              id, QStringLiteral("popoverRow"), text, note)
+        : Item(nullptr,
+            note.isEmpty() ? vx::PopoverWidget::eifText
+                           : vx::PopoverWidget::eifText | vx::PopoverWidget::eifAdditionalText,
+            id, QStringLiteral("popoverRow"), text, note)
     {
     }
 
@@ -57,7 +58,8 @@ class DragRow : public TextRow
 {
 public:
     DragRow(int id, const QString& text, const std::function<void(bool)>& dragging)
-        : TextRow(id, text, QString()), m_dragging(dragging)
+        : TextRow(id, text, QString())
+        , m_dragging(dragging)
     {
         setDragEnabled(true);
         setDragMimeType(s_cameraFormat);
@@ -89,7 +91,8 @@ class DropLabel : public QLabel
 {
 public:
     DropLabel(const QString& text, const std::function<void(const QString&)>& dropped)
-        : QLabel(text), m_dropped(dropped)
+        : QLabel(text)
+        , m_dropped(dropped)
     {
         setAcceptDrops(true);
         setMinimumSize(170, 64);
@@ -147,11 +150,14 @@ PopoversPage::PopoversPage(SignalLog& log, QWidget* parent)
         target->setFixedSize(26, 26); // so small that arrows in the corners are right-angled
         target->setStyleSheet(QStringLiteral("padding: 0; min-width: 24px; min-height: 24px;"));
         target->setObjectName(QStringLiteral("target%1").arg(i + 1));
-        connect(target, &QPushButton::clicked, this, [this, target] { open(target, bitsOf(m_sides), bitsOf(m_features)); });
+        connect(target, &QPushButton::clicked, this,
+            [this, target] { open(target, bitsOf(m_sides), bitsOf(m_features)); });
         const Qt::Alignment across = s_columns[i] == 0 ? Qt::AlignLeft
             : s_columns[i] == 3                        ? Qt::AlignRight
                                                        : Qt::AlignHCenter;
-        const Qt::Alignment down = s_lines[i] == 0 ? Qt::AlignTop : s_lines[i] == 3 ? Qt::AlignBottom : Qt::AlignVCenter;
+        const Qt::Alignment down = s_lines[i] == 0 ? Qt::AlignTop
+            : s_lines[i] == 3                      ? Qt::AlignBottom
+                                                   : Qt::AlignVCenter;
         grid->addWidget(target, s_lines[i], s_columns[i], across | down);
         m_targets << target;
     }
@@ -210,8 +216,9 @@ QWidget* PopoversPage::makeSettings()
     }
     layout->addSpacing(8);
     layout->addWidget(label(tr("Features"), "heading"));
-    m_features = {makeBox(tr("Title"), Balloon::ebfTitle, true), makeBox(tr("Close button"), Balloon::ebfClose, true),
-        makeBox(tr("Help button"), Balloon::ebfHelp, false), makeBox(tr("No title bar"), Balloon::ebfNoHeader, false)};
+    m_features = {makeBox(tr("Title"), Balloon::ebfTitle, true),
+        makeBox(tr("Close button"), Balloon::ebfClose, true), makeBox(tr("Help button"), Balloon::ebfHelp, false),
+        makeBox(tr("No title bar"), Balloon::ebfNoHeader, false)};
     for (QCheckBox* feature : qAsConst(m_features)) {
         layout->addWidget(feature);
     }
@@ -271,8 +278,7 @@ QWidget* PopoversPage::makeDragHelp()
     return box;
 }
 
-QPointer<PopoversPage::Controller> PopoversPage::makePopover(
-    QWidget* target, const QString& title, int sides)
+QPointer<PopoversPage::Controller> PopoversPage::makePopover(QWidget* target, const QString& title, int sides)
 {
     Manager* const manager = Manager::instance();
     QPointer<Controller> controller = manager->createController(manager->getUniquePopoverID(), false, false, this,
@@ -285,8 +291,7 @@ QPointer<PopoversPage::Controller> PopoversPage::makePopover(
 void PopoversPage::open(QWidget* target, int sides, int features)
 {
     const QPointer<Controller> controller = makePopover(target, tr("Cameras"), sides);
-    controller->setContainer(
-        makeRows(m_rows->currentData().toInt()), Balloon::EBalloonFeatures(QFlag(features)));
+    controller->setContainer(makeRows(m_rows->currentData().toInt()), Balloon::EBalloonFeatures(QFlag(features)));
     controller->setActive(true, m_grow->isChecked() ? Controller::epsGrow : Controller::epsBalloon, true);
 }
 
@@ -313,11 +318,13 @@ void PopoversPage::fillTray()
     m_tray = makePopover(m_dropped, tr("Favourites"), Balloon::eadTop | Balloon::eadBottom);
     m_tray->setPersistence(true);
     auto* content = new Container(nullptr, QStringLiteral("tray"), Qt::Vertical, Qt::AlignTop);
-    content->addWidgetItem(new DropLabel(tr("Drop it here"),
-                               [this](const QString& camera) { m_dropped->setText(tr("Dropped: %1").arg(camera)); }),
+    content->addWidgetItem(
+        new DropLabel(tr("Drop it here"),
+            [this](const QString& camera) { m_dropped->setText(tr("Dropped: %1").arg(camera)); }),
         QStringLiteral("drop"), 0);
     m_tray->setContainer(content, Balloon::ebfTitle);
-    Manager::instance()->registerAcceptedDropMimeType(Manager::instance()->getControllerID(m_tray), s_cameraFormat);
+    Manager::instance()->registerAcceptedDropMimeType(
+        Manager::instance()->getControllerID(m_tray), s_cameraFormat);
 }
 
 void PopoversPage::rehearse(Hand& hand)

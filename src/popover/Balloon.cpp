@@ -393,27 +393,26 @@ QSize Balloon::getBalloonSizeFromContent() const
             m_container->adjustSize();
             m_contentHint = m_container->sizeHint();
         }
-        content = BalloonGeometry::contentSize(
-            m_contentHint, m_container->minimumSize(), m_container->maximumSize());
+        content
+            = BalloonGeometry::contentSize(m_contentHint, m_container->minimumSize(), m_container->maximumSize());
         if (const Container* const widget = m_container->header()) {
-            header = Strip{widget->isVisible(), widget->sizeHint()};
+            header = Strip {widget->isVisible(), widget->sizeHint()};
         }
         if (const Container* const widget = m_container->footer()) {
-            footer = Strip{widget->isVisible(), widget->sizeHint()};
+            footer = Strip {widget->isVisible(), widget->sizeHint()};
         }
     } else {
         content = QSize(0, 0);
     }
     return BalloonGeometry::sizeFromContent(content, int(m_arrowDirection), m_innerMargin, m_arrowLength,
-        spacing(), {Strip{m_titleBar->isVisible(), m_titleBar->sizeHint()}, header, footer});
+        spacing(), {Strip {m_titleBar->isVisible(), m_titleBar->sizeHint()}, header, footer});
 }
 
-QRectF Balloon::frameRect(const QRectF& parentRect, const QSizeF& size, const QPointF& anchor, int side,
-    int /*arrowLength*/) const
+QRectF Balloon::frameRect(
+    const QRectF& parentRect, const QSizeF& size, const QPointF& anchor, int side, int /*arrowLength*/) const
 {
     const QMargins borders(m_leftBorderMargin, m_topBorderMargin, m_rightBorderMargin, m_bottomBorderMargin);
-    return BalloonGeometry::frame(
-        BalloonGeometry::limits(parentRect, borders), size, anchor, side, m_innerMargin);
+    return BalloonGeometry::frame(BalloonGeometry::limits(parentRect, borders), size, anchor, side, m_innerMargin);
 }
 
 QRectF Balloon::innerRect() const
@@ -493,8 +492,8 @@ void Balloon::paintEvent(QPaintEvent* /*event*/)
     if (look.border.isValid()) {
         painter.setPen(QPen(look.border, 1.0, Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin));
     }
-    painter.drawPath(getPainterPathForDownArrow(
-        m_arrowWidth, m_arrowLength, int(m_arrowDirection), m_anchorPoint - pos()));
+    painter.drawPath(
+        getPainterPathForDownArrow(m_arrowWidth, m_arrowLength, int(m_arrowDirection), m_anchorPoint - pos()));
 }
 
 void Balloon::mouseReleaseEvent(QMouseEvent* event)

@@ -63,8 +63,8 @@ void addBody(QPainterPath& path, const QRectF& inner, int radius)
 }
 
 // Whether base and tip of the arrow lie so that one walk round the body gives the union of both.
-bool standsOnStraightEdge(
-    const QRectF& inner, qreal rx, qreal ry, int side, const QPointF& anchor, const QPointF& from, const QPointF& to)
+bool standsOnStraightEdge(const QRectF& inner, qreal rx, qreal ry, int side, const QPointF& anchor,
+    const QPointF& from, const QPointF& to)
 {
     if (side == sTop || side == sBottom) {
         const bool outside = side == sTop ? anchor.y() < inner.top() : anchor.y() > inner.bottom();
@@ -229,8 +229,7 @@ QSizeF constrainedSize(const QSizeF& size, const QSizeF& fixed, int constraints)
 
 QRectF limits(const QRectF& parentRect, const QMargins& borders)
 {
-    return parentRect.adjusted(
-        borders.left(), borders.top(), -qreal(borders.right()), -qreal(borders.bottom()));
+    return parentRect.adjusted(borders.left(), borders.top(), -qreal(borders.right()), -qreal(borders.bottom()));
 }
 
 QRectF frame(const QRectF& limits, const QSizeF& size, const QPointF& anchor, int side, int innerMargin)
@@ -310,8 +309,7 @@ bool arrowDrawn(int allowed, const QRectF& inner, const QPointF& anchor)
     return allowed != 0 && !inner.contains(toPoint(anchor));
 }
 
-QPainterPath outline(
-    const QRectF& inner, int radius, bool arrow, int arrowWidth, int side, const QPointF& anchor)
+QPainterPath outline(const QRectF& inner, int radius, bool arrow, int arrowWidth, int side, const QPointF& anchor)
 {
     QPainterPath path;
     if (!arrow || !isOneSide(side)) {

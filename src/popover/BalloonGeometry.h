@@ -44,8 +44,7 @@ struct Strip
 /// The place of @p node in the coordinates of @p parent, through their nearest common ancestor. Nodes have pos(),
 /// relative to parentWidget(). Without a common ancestor both are counted from the same origin; without a parent
 /// the result is relative to the outermost ancestor's.
-template<class Node>
-QPoint positionIn(const Node* node, const Node* parent)
+template <class Node> QPoint positionIn(const Node* node, const Node* parent)
 {
     QPoint position = node->pos();
     const Node* up = node->parentWidget();
@@ -70,8 +69,8 @@ QPoint positionIn(const Node* node, const Node* parent)
 ZELKOV_WIDGETS_EXPORT int preferredSide(
     const QRect& parentRect, const QRect& target, const QPointF& position, int allowed);
 
-/// The point that the tip of the arrow touches. @p position is the origin of the target; of @p target only the size
-/// counts. Coordinates of @p relative count if greater than 0.
+/// The point that the tip of the arrow touches. @p position is the origin of the target; of @p target only the
+/// size counts. Coordinates of @p relative count if greater than 0.
 ZELKOV_WIDGETS_EXPORT QPointF anchorPoint(
     const QRect& target, const QPointF& relative, int side, const QPointF& position);
 

@@ -21,7 +21,7 @@ QColor balloonMix(const QColor& a, const QColor& b, qreal share)
 BalloonLook BalloonLook::resolved(
     const QColor& background, const QColor& background2, const QColor& border, const QPalette& palette)
 {
-    BalloonLook look{background, background2, border};
+    BalloonLook look {background, background2, border};
     if (background.isValid() || background2.isValid()) {
         if (!background.isValid()) {
             look.lower = background2;

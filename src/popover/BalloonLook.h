@@ -15,10 +15,10 @@ namespace PopoverWidget
 struct ZELKOV_WIDGETS_EXPORT BalloonLook
 {
     /// The look for these colours of a balloon, each of which may be invalid. One body colour stands in for the
-    /// other; with neither, the body has the colour of the palette's buttons (of its windows, if words would be hard
-    /// to read), and with no colour at all a border that is seen on light and on dark windows.
-    static BalloonLook resolved(const QColor& background, const QColor& background2, const QColor& border,
-        const QPalette& palette);
+    /// other; with neither, the body has the colour of the palette's buttons (of its windows, if words would be
+    /// hard to read), and with no colour at all a border that is seen on light and on dark windows.
+    static BalloonLook resolved(
+        const QColor& background, const QColor& background2, const QColor& border, const QPalette& palette);
 
     QColor lower; ///< at the end of the gradient
     QColor upper; ///< from its middle on

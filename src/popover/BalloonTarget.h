@@ -21,8 +21,8 @@ namespace BalloonTarget
 /// Whether the window of the widget sits in a graphics scene.
 ZELKOV_WIDGETS_EXPORT bool isProxied(const QWidget* widget);
 
-/// Global coordinates of a point of the widget, through the graphics view if it is embedded in one. A scene with no
-/// view or several gives (0, 0), since the point has no one place then.
+/// Global coordinates of a point of the widget, through the graphics view if it is embedded in one. A scene with
+/// no view or several gives (0, 0), since the point has no one place then.
 ZELKOV_WIDGETS_EXPORT QPoint mapToGlobal(const QWidget* widget, const QPoint& point);
 
 /// The extent of the target. A valid rectangle wins over a widget; without either the result is invalid.

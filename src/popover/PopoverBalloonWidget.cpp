@@ -69,8 +69,7 @@ Controller::EPopoverShowFlags showFlagsForText()
     return Controller::epsBalloon | Controller::epsNoFade | Controller::epsMouseTransparent;
 }
 
-template<class Map>
-typename Map::mapped_type firstThatContains(const Map& map, int value)
+template <class Map> typename Map::mapped_type firstThatContains(const Map& map, int value)
 {
     for (auto it = map.cbegin(); it != map.cend(); ++it) {
         if (it.key().contains(value)) {

@@ -78,7 +78,10 @@ public:
     using Balloon = vx::PopoverWidget::Balloon;
     using Container = vx::PopoverWidget::Container;
 
-    static QFlags<Balloon::EArrowDirection> sides(int bits) { return QFlags<Balloon::EArrowDirection>(QFlag(bits)); }
+    static QFlags<Balloon::EArrowDirection> sides(int bits)
+    {
+        return QFlags<Balloon::EArrowDirection>(QFlag(bits));
+    }
     static QFlags<Balloon::EBalloonFeature> features(int bits)
     {
         return QFlags<Balloon::EBalloonFeature>(QFlag(bits));

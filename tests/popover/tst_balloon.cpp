@@ -195,7 +195,8 @@ void TestBalloon::allPropertiesCanBeSetByStyleSheets()
     BalloonScene scene;
     Balloon* const balloon = scene.make();
     scene.window.setStyleSheet(QStringLiteral(
-        "vx--PopoverWidget--Balloon { qproperty-spacing: 1; qproperty-innerMargin: 2; qproperty-topBorderMargin: 3;"
+        "vx--PopoverWidget--Balloon { qproperty-spacing: 1; qproperty-innerMargin: 2; qproperty-topBorderMargin: "
+        "3;"
         "qproperty-bottomBorderMargin: 5; qproperty-leftBorderMargin: 6; qproperty-rightBorderMargin: 7;"
         "qproperty-arrowLength: 8; qproperty-arrowWidth: 9; qproperty-backgroundColor: #102030;"
         "qproperty-backgroundColor2: #405060; qproperty-borderColor: #708090; qproperty-borderRadius: 10; }"));
@@ -311,7 +312,7 @@ void TestBalloon::signalsKeepTheirOrder()
     for (int i = meta.methodOffset(); i < meta.methodCount(); ++i) {
         methods << meta.method(i).methodSignature();
     }
-    const QList<QByteArray> expected{"dismiss()", "help()", "layoutUpdated()", "contentScrolled()",
+    const QList<QByteArray> expected {"dismiss()", "help()", "layoutUpdated()", "contentScrolled()",
         "setForRect(QRect)", "setMargins(int,int,int,int)", "setupLayout(bool)", "setupLayout()",
         "setVisible(bool)", "forWidgetDestroyed()"};
     QCOMPARE(methods, expected);
@@ -331,10 +332,10 @@ void TestBalloon::theButtonsEmitDismissAndHelp()
         pointer.click(button->mapTo(&scene.window, button->rect().center()));
     };
     click("popoverCloseButton");
-    QCOMPARE(recorder.names(), QStringList{QStringLiteral("dismiss")});
+    QCOMPARE(recorder.names(), QStringList {QStringLiteral("dismiss")});
     recorder.clear();
     click("popoverHelpButton");
-    QCOMPARE(recorder.names(), QStringList{QStringLiteral("help")});
+    QCOMPARE(recorder.names(), QStringList {QStringLiteral("help")});
 }
 
 void TestBalloon::scrollingEmitsContentScrolled()
@@ -347,13 +348,14 @@ void TestBalloon::scrollingEmitsContentScrolled()
     QScrollBar* const vertical = balloon->content()->verticalScrollBar();
     QVERIFY(vertical->maximum() > 10);
     vertical->setValue(10);
-    QCOMPARE(recorder.names(), QStringList{QStringLiteral("contentScrolled")});
+    QCOMPARE(recorder.names(), QStringList {QStringLiteral("contentScrolled")});
     vertical->setValue(10);
     QCOMPARE(recorder.names().size(), 1);
     QScrollBar* const horizontal = balloon->content()->horizontalScrollBar();
     QVERIFY(horizontal->maximum() > 10);
     horizontal->setValue(5);
-    QCOMPARE(recorder.names(), QStringList({QStringLiteral("contentScrolled"), QStringLiteral("contentScrolled")}));
+    QCOMPARE(
+        recorder.names(), QStringList({QStringLiteral("contentScrolled"), QStringLiteral("contentScrolled")}));
 }
 
 void TestBalloon::aReleaseOnTheArrowStripDismisses_data()
@@ -391,7 +393,7 @@ void TestBalloon::aReleaseOnTheArrowStripDismisses()
     SignalRecorder recorder(balloon);
     QMouseEvent release(QEvent::MouseButtonRelease, position, Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
     QCoreApplication::sendEvent(balloon, &release);
-    QCOMPARE(recorder.names(), dismisses ? QStringList{QStringLiteral("dismiss")} : QStringList());
+    QCOMPARE(recorder.names(), dismisses ? QStringList {QStringLiteral("dismiss")} : QStringList());
 }
 
 void TestBalloon::aRealClickOnTheStripDismissesOnceAndStaysThere()
@@ -405,7 +407,7 @@ void TestBalloon::aRealClickOnTheStripDismissesOnceAndStaysThere()
     releases.watch(scene.parent);
     zelkovtest::Pointer pointer(&scene.window);
     pointer.click(balloon->mapTo(&scene.window, QPoint(5, 5)));
-    QCOMPARE(recorder.names(), QStringList{QStringLiteral("dismiss")});
+    QCOMPARE(recorder.names(), QStringList {QStringLiteral("dismiss")});
     pointer.click(balloon->mapTo(&scene.window, QPoint(1, 30)));
     QCOMPARE(recorder.names().size(), 1);
     QCOMPARE(releases.count(), 0);

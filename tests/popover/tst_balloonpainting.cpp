@@ -166,8 +166,8 @@ void TestBalloonPainting::nearACornerTheArrowIsStraightTowardsIt_data()
     QTest::addColumn<bool>("left");
     QTest::addColumn<bool>("right");
 
-    // The balloon is pushed to 4 to 112, or to 288 to 396; the base is 15 to each side, the strip 15 high. Beside the
-    // tip, at three quarters of the way, a slope of its own is 11 pixels wide.
+    // The balloon is pushed to 4 to 112, or to 288 to 396; the base is 15 to each side, the strip 15 high. Beside
+    // the tip, at three quarters of the way, a slope of its own is 11 pixels wide.
     QTest::newRow("more than twice the width off the left") << 4 + 31 << true << true;
     QTest::newRow("twice the width off the left") << 4 + 30 << false << true;
     QTest::newRow("nearer to the left") << 4 + 15 << false << true;

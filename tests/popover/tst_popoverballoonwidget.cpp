@@ -44,17 +44,20 @@ public:
         : Item(parent, vx::PopoverWidget::eifText, id, QStringLiteral("item"), QStringLiteral("Row"), QString())
     {
     }
-    void perform() { Q_EMIT itemPerformed(id(), QVariant(), QVariant(), vx::PopoverWidget::EItemPerformedFlags()); }
+    void perform()
+    {
+        Q_EMIT itemPerformed(id(), QVariant(), QVariant(), vx::PopoverWidget::EItemPerformedFlags());
+    }
 };
 
 class Values : public PopoverBalloonWidget
 {
 public:
-    using PopoverBalloonWidget::PopoverBalloonWidget;
     using PopoverBalloonWidget::clearUnparentedBalloonItems;
     using PopoverBalloonWidget::getBalloonItemForValue;
     using PopoverBalloonWidget::getBalloonTextForValue;
     using PopoverBalloonWidget::obtainWindow;
+    using PopoverBalloonWidget::PopoverBalloonWidget;
     using PopoverBalloonWidget::popoverOpen;
 };
 
@@ -221,9 +224,9 @@ void TestPopoverBalloonWidget::oneLabelServesAllTexts()
     QLabel* const label = scene.labels().first();
     scene.controller()->dismiss(false, true);
     scene.values->setBalloonText(QStringLiteral("two"));
-    QCOMPARE(scene.labels(), QList<QLabel*>{label});
+    QCOMPARE(scene.labels(), QList<QLabel*> {label});
     QCOMPARE(label->text(), QStringLiteral("two"));
-    QCOMPARE(scene.container()->getItemIDs(), QList<int>{-1});
+    QCOMPARE(scene.container()->getItemIDs(), QList<int> {-1});
     QVERIFY(scene.controller()->isActive());
 }
 
@@ -356,7 +359,8 @@ void TestPopoverBalloonWidget::rowsAreAddedOnceAndDismiss()
     SignalRecorder recorder(scene.container());
     // The controller hears of the dismissal before the recorder does.
     slow->perform();
-    QCOMPARE(recorder.names(), QStringList({QStringLiteral("popoverAboutToClose"), QStringLiteral("dismissPopover"),
+    QCOMPARE(recorder.names(),
+        QStringList({QStringLiteral("popoverAboutToClose"), QStringLiteral("dismissPopover"),
             QStringLiteral("itemPerformed")}));
 }
 
@@ -455,7 +459,7 @@ void TestPopoverBalloonWidget::aDeadRowIsSkipped()
     scene.values->setBalloonTextMap({{ValueRange(0, 9), QStringLiteral("text")}});
     delete dead;
     scene.values->updateBalloon(12, 0, 100);
-    QCOMPARE(scene.container()->getItemIDs(), QList<int>{2});
+    QCOMPARE(scene.container()->getItemIDs(), QList<int> {2});
     // A value whose row is dead falls back on its text.
     scene.values->updateBalloon(3, 0, 100);
     QCOMPARE(scene.labels().size(), 1);

@@ -39,22 +39,21 @@ Entry balloonEntry()
         for (int i = 0; i < 12; ++i) {
             rows->addWidgetItem(new QPushButton(QStringLiteral("Row")), QStringLiteral("row"), i);
         }
-        auto* const balloon = new Balloon(host, target, rows, Balloon::ebfTitle | Balloon::ebfClose | Balloon::ebfHelp,
-            Balloon::eadTop, QSizeF(), Balloon::ESizeConstraints());
+        auto* const balloon
+            = new Balloon(host, target, rows, Balloon::ebfTitle | Balloon::ebfClose | Balloon::ebfHelp,
+                Balloon::eadTop, QSizeF(), Balloon::ESizeConstraints());
         balloon->setTitle(QStringLiteral("Title"));
-        return Subject{balloon, balloon};
+        return Subject {balloon, balloon};
     };
     entry.exercise = {
         {"close button", {"dismiss"}, {clickPart("popoverCloseButton")}},
         {"arrow strip", {"dismiss"}, {mousePress(QPoint(2, 2), 0), mouseRelease(QPoint(2, 2), 10)}},
         {"help button", {"help"}, {clickPart("popoverHelpButton")}},
-        {"scroll", {"contentScrolled"},
-            {[](const Subject& subject) {
-                QScrollBar* const bar
-                    = static_cast<Balloon*>(subject.object.data())->content()->verticalScrollBar();
-                bar->setRange(0, 100);
-                bar->setValue(40);
-            }}},
+        {"scroll", {"contentScrolled"}, {[](const Subject& subject) {
+             QScrollBar* const bar = static_cast<Balloon*>(subject.object.data())->content()->verticalScrollBar();
+             bar->setRange(0, 100);
+             bar->setValue(40);
+         }}},
         // Nobody but a subclass emits it.
         {"subclass", {"layoutUpdated"}, {call(&Balloon::layoutUpdated)}},
     };
