@@ -12,6 +12,11 @@
 #include "pages/LabelsPage.h"
 #include "pages/MouseGesturesPage.h"
 #include "pages/PopoversPage.h"
+#include "pages/PanelsPage.h"
+#include "pages/PagesPage.h"
+#include "pages/ZoomAreaPage.h"
+#include "pages/RubberBandPage.h"
+#include "pages/ToolBarPage.h"
 #include "pages/ScrollBarsPage.h"
 #include "pages/TimeLinePage.h"
 
@@ -88,6 +93,33 @@ const QVector<PageEntry>& pages()
                            "A popover points at what it belongs to, keeps inside the window and closes with a click "
                            "beside it. Click a number."),
          &make<PopoversPage>},
+        {"panels", QT_TRANSLATE_NOOP("gallery::PageList", "Views"), QT_TRANSLATE_NOOP("gallery::PageList", "Panels"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "FadeView is a strip at the edge of a view that slides open, over the picture or as part "
+                           "of a layout, and can take the full height."),
+         &make<PanelsPage>},
+        {"pages", QT_TRANSLATE_NOOP("gallery::PageList", "Views"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Pages and slideshow"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "NavigationViewController slides from page to page and tells each of its coming and going; "
+                           "WidgetSlideshow moves on by itself."),
+         &make<PagesPage>},
+        {"zoom-area", QT_TRANSLATE_NOOP("gallery::PageList", "Views"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Zoom area"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "ZoomScrollArea turns the wheel into a steady stream of zoom factors instead of scrolling."),
+         &make<ZoomAreaPage>},
+        {"rubber-band", QT_TRANSLATE_NOOP("gallery::PageList", "Views"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Rubber band"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "RubberBandWidget marks a region of a picture in the picture's own units: move it, resize "
+                           "it, turn it over."),
+         &make<RubberBandPage>},
+        {"tool-bars", QT_TRANSLATE_NOOP("gallery::PageList", "Views"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Tool bar customising"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "CustomToolBar reports which action was dropped where, and which one is to go."),
+         &make<ToolBarPage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

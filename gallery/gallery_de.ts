@@ -825,6 +825,180 @@
         <source>MultiNubsieSlider has any number of handles on one scale, kept apart only as far as needed. Drag them, double-click them, click the flags.</source>
         <translation>MultiNubsieSlider hat beliebig viele Griffe auf einer Skala, die nur so weit wie nötig auseinanderrücken. Ziehen Sie sie, doppelklicken Sie darauf, klicken Sie auf die Fahnen.</translation>
     </message>
+    <message>
+        <source>Views</source>
+        <translation>Ansichten</translation>
+    </message>
+    <message>
+        <source>Panels</source>
+        <translation>Schiebeflächen</translation>
+    </message>
+    <message>
+        <source>FadeView is a strip at the edge of a view that slides open, over the picture or as part of a layout, and can take the full height.</source>
+        <translation>FadeView ist ein Streifen am Rand einer Ansicht, der sich aufschiebt, über dem Bild oder als Teil eines Layouts, und die volle Höhe einnehmen kann.</translation>
+    </message>
+    <message>
+        <source>Pages and slideshow</source>
+        <translation>Seiten und Diaschau</translation>
+    </message>
+    <message>
+        <source>NavigationViewController slides from page to page and tells each of its coming and going; WidgetSlideshow moves on by itself.</source>
+        <translation>NavigationViewController schiebt von Seite zu Seite und meldet jeder ihr Kommen und Gehen; WidgetSlideshow läuft von selbst weiter.</translation>
+    </message>
+    <message>
+        <source>Zoom area</source>
+        <translation>Zoombereich</translation>
+    </message>
+    <message>
+        <source>ZoomScrollArea turns the wheel into a steady stream of zoom factors instead of scrolling.</source>
+        <translation>ZoomScrollArea macht aus dem Mausrad einen stetigen Strom von Zoomfaktoren, statt zu rollen.</translation>
+    </message>
+    <message>
+        <source>Rubber band</source>
+        <translation>Gummiband</translation>
+    </message>
+    <message>
+        <source>RubberBandWidget marks a region of a picture in the picture&apos;s own units: move it, resize it, turn it over.</source>
+        <translation>RubberBandWidget markiert einen Bereich eines Bildes in dessen eigenen Einheiten: verschieben, vergrößern, umklappen.</translation>
+    </message>
+    <message>
+        <source>Tool bar customising</source>
+        <translation>Symbolleisten anpassen</translation>
+    </message>
+    <message>
+        <source>CustomToolBar reports which action was dropped where, and which one is to go.</source>
+        <translation>CustomToolBar meldet, welche Aktion wo abgelegt wurde und welche entfernt werden soll.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PagesPage</name>
+    <message>
+        <source>Camera</source>
+        <translation>Kamera</translation>
+    </message>
+    <message>
+        <source>What the new camera is called and where it hangs.</source>
+        <translation>Wie die neue Kamera heißt und wo sie hängt.</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Name</translation>
+    </message>
+    <message>
+        <source>North gate</source>
+        <translation>Nordtor</translation>
+    </message>
+    <message>
+        <source>Building</source>
+        <translation>Gebäude</translation>
+    </message>
+    <message>
+        <source>Yard</source>
+        <translation>Hof</translation>
+    </message>
+    <message>
+        <source>Network</source>
+        <translation>Netzwerk</translation>
+    </message>
+    <message>
+        <source>Where the camera is reached. The port is rarely another one.</source>
+        <translation>Wo die Kamera erreichbar ist. Der Port ist selten ein anderer.</translation>
+    </message>
+    <message>
+        <source>Address</source>
+        <translation>Adresse</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <source>Recording</source>
+        <translation>Aufzeichnung</translation>
+    </message>
+    <message>
+        <source>How long pictures are kept, and how many a second.</source>
+        <translation>Wie lange Bilder aufbewahrt werden und wie viele je Sekunde.</translation>
+    </message>
+    <message>
+        <source>Days</source>
+        <translation>Tage</translation>
+    </message>
+    <message>
+        <source>Pictures</source>
+        <translation>Bilder</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+    <message>
+        <source>Next</source>
+        <translation>Weiter</translation>
+    </message>
+    <message>
+        <source>Main street</source>
+        <translation>Hauptstraße</translation>
+    </message>
+    <message>
+        <source>Reception</source>
+        <translation>Empfang</translation>
+    </message>
+    <message>
+        <source>Container yard</source>
+        <translation>Containerhof</translation>
+    </message>
+    <message>
+        <source>Slideshow</source>
+        <translation>Diaschau</translation>
+    </message>
+    <message>
+        <source>The next camera every five seconds</source>
+        <translation>Alle fünf Sekunden die nächste Kamera</translation>
+    </message>
+    <message>
+        <source>Step %1 of %2</source>
+        <translation>Schritt %1 von %2</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PanelsPage</name>
+    <message>
+        <source>North gate</source>
+        <translation>Nordtor</translation>
+    </message>
+    <message>
+        <source>Latest events</source>
+        <translation>Letzte Ereignisse</translation>
+    </message>
+    <message>
+        <source>Other cameras</source>
+        <translation>Andere Kameras</translation>
+    </message>
+    <message>
+        <source>Upper panel</source>
+        <translation>Obere Fläche</translation>
+    </message>
+    <message>
+        <source>Lower panel</source>
+        <translation>Untere Fläche</translation>
+    </message>
+    <message>
+        <source>Full height</source>
+        <translation>Volle Höhe</translation>
+    </message>
+    <message>
+        <source>Start at the edge</source>
+        <translation>Am Rand beginnen</translation>
+    </message>
+    <message>
+        <source>fadein() and fadeout() with force: not from where the panel is</source>
+        <translation>fadein() und fadeout() mit force: nicht von da, wo die Fläche steht</translation>
+    </message>
+    <message>
+        <source>Click the strips, also while a panel moves.</source>
+        <translation>Klicken Sie auf die Streifen, auch während sich eine Fläche bewegt.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PopoversPage</name>
@@ -943,6 +1117,57 @@
     <message>
         <source>Dropped: %1</source>
         <translation>Abgelegt: %1</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::RubberBandPage</name>
+    <message>
+        <source>Container yard</source>
+        <translation>Containerhof</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Tor</translation>
+    </message>
+    <message>
+        <source>Crane</source>
+        <translation>Kran</translation>
+    </message>
+    <message>
+        <source>Left</source>
+        <translation>Links</translation>
+    </message>
+    <message>
+        <source>Top</source>
+        <translation>Oben</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Breite</translation>
+    </message>
+    <message>
+        <source>Height</source>
+        <translation>Höhe</translation>
+    </message>
+    <message>
+        <source>Keep 16 : 9</source>
+        <translation>16 : 9 beibehalten</translation>
+    </message>
+    <message>
+        <source>New region</source>
+        <translation>Neuer Bereich</translation>
+    </message>
+    <message>
+        <source>Drag edges, corners or the inside. Shift keeps the proportions.</source>
+        <translation>Ziehen Sie an Kanten, Ecken oder innen. Umschalt hält die Proportionen.</translation>
+    </message>
+    <message>
+        <source>Pixels of the camera</source>
+        <translation>Pixel der Kamera</translation>
+    </message>
+    <message>
+        <source>Region %1</source>
+        <translation>Bereich %1</translation>
     </message>
 </context>
 <context>
@@ -1096,6 +1321,88 @@
     <message>
         <source>To export: %1 to %2</source>
         <translation>Zu exportieren: %1 bis %2</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ToolBarPage</name>
+    <message>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+    <message>
+        <source>Play</source>
+        <translation>Abspielen</translation>
+    </message>
+    <message>
+        <source>Pause</source>
+        <translation>Pause</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Vor</translation>
+    </message>
+    <message>
+        <source>Record</source>
+        <translation>Aufnehmen</translation>
+    </message>
+    <message>
+        <source>Snapshot</source>
+        <translation>Schnappschuss</translation>
+    </message>
+    <message>
+        <source>Camera wall</source>
+        <translation>Kamerawand</translation>
+    </message>
+    <message>
+        <source>Flag</source>
+        <translation>Markieren</translation>
+    </message>
+    <message>
+        <source>Drag an action from the list onto a bar.</source>
+        <translation>Ziehen Sie eine Aktion aus der Liste auf eine Leiste.</translation>
+    </message>
+    <message>
+        <source>%1 before %2</source>
+        <translation>%1 vor %2</translation>
+    </message>
+    <message>
+        <source>%1 at the end</source>
+        <translation>%1 am Ende</translation>
+    </message>
+    <message>
+        <source>%1 removed</source>
+        <translation>%1 entfernt</translation>
+    </message>
+    <message>
+        <source>Bar dropped: %1</source>
+        <translation>Leiste abgelegt: %1</translation>
+    </message>
+    <message>
+        <source>Drag an action onto a bar; right click an action there to remove it. The bars can be dragged by their empty part.</source>
+        <translation>Ziehen Sie eine Aktion auf eine Leiste; ein Rechtsklick dort entfernt sie. Die Leisten lassen sich an ihrem leeren Teil ziehen.</translation>
+    </message>
+    <message>
+        <source>Actions</source>
+        <translation>Aktionen</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ZoomAreaPage</name>
+    <message>
+        <source>Original size</source>
+        <translation>Originalgröße</translation>
+    </message>
+    <message>
+        <source>Scroll bars</source>
+        <translation>Rollbalken</translation>
+    </message>
+    <message>
+        <source>Turn the wheel over the picture; scroll with the bars.</source>
+        <translation>Drehen Sie das Rad über dem Bild; rollen Sie mit den Balken.</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
     </message>
 </context>
 </TS>

@@ -825,6 +825,180 @@
         <source>MultiNubsieSlider has any number of handles on one scale, kept apart only as far as needed. Drag them, double-click them, click the flags.</source>
         <translation>MultiNubsieSlider porte autant de poignées que l&apos;on veut sur une échelle, écartées seulement autant qu&apos;il le faut. Faites-les glisser, double-cliquez-les, cliquez sur les drapeaux.</translation>
     </message>
+    <message>
+        <source>Views</source>
+        <translation>Vues</translation>
+    </message>
+    <message>
+        <source>Panels</source>
+        <translation>Panneaux</translation>
+    </message>
+    <message>
+        <source>FadeView is a strip at the edge of a view that slides open, over the picture or as part of a layout, and can take the full height.</source>
+        <translation>FadeView est une bande au bord d&apos;une vue qui s&apos;ouvre en glissant, par-dessus l&apos;image ou dans un layout, et peut prendre toute la hauteur.</translation>
+    </message>
+    <message>
+        <source>Pages and slideshow</source>
+        <translation>Pages et diaporama</translation>
+    </message>
+    <message>
+        <source>NavigationViewController slides from page to page and tells each of its coming and going; WidgetSlideshow moves on by itself.</source>
+        <translation>NavigationViewController glisse d&apos;une page à l&apos;autre et annonce à chacune son arrivée et son départ ; WidgetSlideshow avance toute seule.</translation>
+    </message>
+    <message>
+        <source>Zoom area</source>
+        <translation>Zone de zoom</translation>
+    </message>
+    <message>
+        <source>ZoomScrollArea turns the wheel into a steady stream of zoom factors instead of scrolling.</source>
+        <translation>ZoomScrollArea transforme la molette en un flux régulier de facteurs de zoom au lieu de défiler.</translation>
+    </message>
+    <message>
+        <source>Rubber band</source>
+        <translation>Cadre élastique</translation>
+    </message>
+    <message>
+        <source>RubberBandWidget marks a region of a picture in the picture&apos;s own units: move it, resize it, turn it over.</source>
+        <translation>RubberBandWidget marque une région d&apos;une image dans les unités de celle-ci : on la déplace, la redimensionne, la retourne.</translation>
+    </message>
+    <message>
+        <source>Tool bar customising</source>
+        <translation>Barres d&apos;outils personnalisées</translation>
+    </message>
+    <message>
+        <source>CustomToolBar reports which action was dropped where, and which one is to go.</source>
+        <translation>CustomToolBar signale quelle action a été déposée où, et laquelle doit partir.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PagesPage</name>
+    <message>
+        <source>Camera</source>
+        <translation>Caméra</translation>
+    </message>
+    <message>
+        <source>What the new camera is called and where it hangs.</source>
+        <translation>Le nom de la nouvelle caméra et son emplacement.</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Nom</translation>
+    </message>
+    <message>
+        <source>North gate</source>
+        <translation>Portail nord</translation>
+    </message>
+    <message>
+        <source>Building</source>
+        <translation>Bâtiment</translation>
+    </message>
+    <message>
+        <source>Yard</source>
+        <translation>Cour</translation>
+    </message>
+    <message>
+        <source>Network</source>
+        <translation>Réseau</translation>
+    </message>
+    <message>
+        <source>Where the camera is reached. The port is rarely another one.</source>
+        <translation>Où joindre la caméra. Le port est rarement différent.</translation>
+    </message>
+    <message>
+        <source>Address</source>
+        <translation>Adresse</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <source>Recording</source>
+        <translation>Enregistrement</translation>
+    </message>
+    <message>
+        <source>How long pictures are kept, and how many a second.</source>
+        <translation>Durée de conservation des images, et leur nombre par seconde.</translation>
+    </message>
+    <message>
+        <source>Days</source>
+        <translation>Jours</translation>
+    </message>
+    <message>
+        <source>Pictures</source>
+        <translation>Images</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>Retour</translation>
+    </message>
+    <message>
+        <source>Next</source>
+        <translation>Suivant</translation>
+    </message>
+    <message>
+        <source>Main street</source>
+        <translation>Grand-rue</translation>
+    </message>
+    <message>
+        <source>Reception</source>
+        <translation>Accueil</translation>
+    </message>
+    <message>
+        <source>Container yard</source>
+        <translation>Parc à conteneurs</translation>
+    </message>
+    <message>
+        <source>Slideshow</source>
+        <translation>Diaporama</translation>
+    </message>
+    <message>
+        <source>The next camera every five seconds</source>
+        <translation>La caméra suivante toutes les cinq secondes</translation>
+    </message>
+    <message>
+        <source>Step %1 of %2</source>
+        <translation>Étape %1 sur %2</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PanelsPage</name>
+    <message>
+        <source>North gate</source>
+        <translation>Portail nord</translation>
+    </message>
+    <message>
+        <source>Latest events</source>
+        <translation>Derniers événements</translation>
+    </message>
+    <message>
+        <source>Other cameras</source>
+        <translation>Autres caméras</translation>
+    </message>
+    <message>
+        <source>Upper panel</source>
+        <translation>Panneau du haut</translation>
+    </message>
+    <message>
+        <source>Lower panel</source>
+        <translation>Panneau du bas</translation>
+    </message>
+    <message>
+        <source>Full height</source>
+        <translation>Pleine hauteur</translation>
+    </message>
+    <message>
+        <source>Start at the edge</source>
+        <translation>Partir du bord</translation>
+    </message>
+    <message>
+        <source>fadein() and fadeout() with force: not from where the panel is</source>
+        <translation>fadein() et fadeout() avec force : pas depuis la position du panneau</translation>
+    </message>
+    <message>
+        <source>Click the strips, also while a panel moves.</source>
+        <translation>Cliquez sur les bandes, même pendant le mouvement.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PopoversPage</name>
@@ -943,6 +1117,57 @@
     <message>
         <source>Dropped: %1</source>
         <translation>Déposé : %1</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::RubberBandPage</name>
+    <message>
+        <source>Container yard</source>
+        <translation>Parc à conteneurs</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Portail</translation>
+    </message>
+    <message>
+        <source>Crane</source>
+        <translation>Grue</translation>
+    </message>
+    <message>
+        <source>Left</source>
+        <translation>Gauche</translation>
+    </message>
+    <message>
+        <source>Top</source>
+        <translation>Haut</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Largeur</translation>
+    </message>
+    <message>
+        <source>Height</source>
+        <translation>Hauteur</translation>
+    </message>
+    <message>
+        <source>Keep 16 : 9</source>
+        <translation>Garder 16 : 9</translation>
+    </message>
+    <message>
+        <source>New region</source>
+        <translation>Nouvelle région</translation>
+    </message>
+    <message>
+        <source>Drag edges, corners or the inside. Shift keeps the proportions.</source>
+        <translation>Tirez les bords, les coins ou l&apos;intérieur. Maj garde les proportions.</translation>
+    </message>
+    <message>
+        <source>Pixels of the camera</source>
+        <translation>Pixels de la caméra</translation>
+    </message>
+    <message>
+        <source>Region %1</source>
+        <translation>Région %1</translation>
     </message>
 </context>
 <context>
@@ -1096,6 +1321,88 @@
     <message>
         <source>To export: %1 to %2</source>
         <translation>À exporter : de %1 à %2</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ToolBarPage</name>
+    <message>
+        <source>Back</source>
+        <translation>Retour</translation>
+    </message>
+    <message>
+        <source>Play</source>
+        <translation>Lecture</translation>
+    </message>
+    <message>
+        <source>Pause</source>
+        <translation>Pause</translation>
+    </message>
+    <message>
+        <source>Forward</source>
+        <translation>Avant</translation>
+    </message>
+    <message>
+        <source>Record</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Snapshot</source>
+        <translation>Instantané</translation>
+    </message>
+    <message>
+        <source>Camera wall</source>
+        <translation>Mur de caméras</translation>
+    </message>
+    <message>
+        <source>Flag</source>
+        <translation>Marquer</translation>
+    </message>
+    <message>
+        <source>Drag an action from the list onto a bar.</source>
+        <translation>Tirez une action de la liste sur une barre.</translation>
+    </message>
+    <message>
+        <source>%1 before %2</source>
+        <translation>%1 avant %2</translation>
+    </message>
+    <message>
+        <source>%1 at the end</source>
+        <translation>%1 à la fin</translation>
+    </message>
+    <message>
+        <source>%1 removed</source>
+        <translation>%1 supprimé</translation>
+    </message>
+    <message>
+        <source>Bar dropped: %1</source>
+        <translation>Barre déposée : %1</translation>
+    </message>
+    <message>
+        <source>Drag an action onto a bar; right click an action there to remove it. The bars can be dragged by their empty part.</source>
+        <translation>Tirez une action sur une barre ; un clic droit l&apos;y supprime. Les barres se tirent par leur partie vide.</translation>
+    </message>
+    <message>
+        <source>Actions</source>
+        <translation>Actions</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::ZoomAreaPage</name>
+    <message>
+        <source>Original size</source>
+        <translation>Taille d&apos;origine</translation>
+    </message>
+    <message>
+        <source>Scroll bars</source>
+        <translation>Barres de défilement</translation>
+    </message>
+    <message>
+        <source>Turn the wheel over the picture; scroll with the bars.</source>
+        <translation>Tournez la molette sur l&apos;image ; défilez avec les barres.</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
     </message>
 </context>
 </TS>

@@ -2,6 +2,7 @@
 // The classes of views/.
 #include "ZelkovUtils/LinearCoordinateSystem.h"
 #include "views/CustomToolBar.h"
+#include "views/FadeStripeView.h"
 #include "views/FadeView.h"
 #include "views/NavigationViewController.h"
 #include "views/RubberBandWidget.h"
@@ -28,6 +29,24 @@ namespace zelkovtest
 namespace
 {
 constexpr QPoint c_viewsCentre(60, 40);
+
+Step viewsDrop(const char* format)
+{
+    return [format](const Subject& subject) {
+        QByteArray id;
+        QDataStream stream(&id, QIODevice::WriteOnly);
+        stream << QStringLiteral("an id");
+        QMimeData data;
+        data.setData(QLatin1String(format), id);
+        const QPoint place(40, 10);
+        QDragEnterEvent enterEvent(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(subject.widget, &enterEvent);
+        QDragMoveEvent moveEvent(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(subject.widget, &moveEvent);
+        QDropEvent drop(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(subject.widget, &drop);
+    };
+}
 
 // --- Rubber band -------------------------------------------------------------------------------------------------
 
@@ -127,6 +146,53 @@ Entry fadeView()
     return entry;
 }
 
+Entry fadeStripeView()
+{
+    Entry entry = fadeView();
+    entry.name = "FadeStripeView";
+    entry.header = "views/FadeStripeView.h";
+    entry.create = [](QWidget* host) {
+        auto* const stripe = new FadeStripeView(FadeView::ePositionTop, nullptr, host);
+        stripe->setFadeStripeAsPartOfLayout(false);
+        stripe->setContentsHeight(40);
+        stripe->setRows(1);
+        return Subject{stripe, stripe};
+    };
+    constexpr QPoint header(20, 5);
+    constexpr QPoint footer(20, 60);
+    // The bars of an open panel can be reached for a moment when it has begun to close.
+    const Step close = call(&FadeStripeView::fadeout, true, false);
+    const std::vector<Script> own = {
+        {"header", {"headerPressed", "headerReleased"}, {mousePress(header, 0), mouseRelease(header, 10)}},
+        {"footer", {"footerPressed", "footerReleased"}, {mousePress(footer, 0), mouseRelease(footer, 10)}},
+        {"header while closing", {"headerReleasedFadedOut"},
+            {close, mousePress(header, 0), mouseRelease(header, 10)}},
+        {"footer while closing", {"footerReleasedFadedOut"},
+            {close, mousePress(footer, 0), mouseRelease(footer, 10)}},
+        {"inactive", {"inactiveClicked"},
+            {close, call(&FadeStripeView::setActive, false), mousePress(header, 0), mouseRelease(header, 10)}},
+        {"drag", {"sizeChanged", "heightChanged"},
+            {mousePress(footer, 0), mouseMove(footer + QPoint(0, 30), 10), mouseRelease(footer + QPoint(0, 30), 20)}},
+        {"double click", {}, {mousePress(QPoint(100, 60), 0), mouseRelease(QPoint(100, 60), 10),
+            mouseDoubleClick(QPoint(100, 60), 20), mouseRelease(QPoint(100, 60), 30)}},
+        {"drop", {"dragAccepted"},
+            {[](const Subject& subject) {
+                static_cast<FadeStripeView*>(subject.object.data())
+                    ->addAcceptedMimeType(QStringLiteral("application/action-id"));
+            },
+                viewsDrop("application/action-id")}},
+    };
+    entry.exercise.insert(entry.exercise.end(), own.begin(), own.end());
+    const std::vector<Setter> setters = {
+        setter("setContentsHeight", &FadeStripeView::setContentsHeight),
+        setter("setRows", &FadeStripeView::setRows),
+        setter("setMaximumHeight", &FadeStripeView::setMaximumHeight),
+        setter("setSizeHint", &FadeStripeView::setSizeHint),
+    };
+    entry.setters.insert(entry.setters.end(), setters.begin(), setters.end());
+    return entry;
+}
+
 // --- Pages -------------------------------------------------------------------------------------------------------
 
 Entry navigationViewController()
@@ -207,24 +273,6 @@ Entry zoomScrollArea()
 
 // --- Tool bar ----------------------------------------------------------------------------------------------------
 
-Step viewsDrop(const char* format)
-{
-    return [format](const Subject& subject) {
-        QByteArray id;
-        QDataStream stream(&id, QIODevice::WriteOnly);
-        stream << QStringLiteral("an id");
-        QMimeData data;
-        data.setData(QLatin1String(format), id);
-        const QPoint place(40, 10);
-        QDragEnterEvent enterEvent(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        QApplication::sendEvent(subject.widget, &enterEvent);
-        QDragMoveEvent moveEvent(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        QApplication::sendEvent(subject.widget, &moveEvent);
-        QDropEvent drop(place, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        QApplication::sendEvent(subject.widget, &drop);
-    };
-}
-
 // Opens the menu of the first action and chooses the entry that removes it.
 void viewsRemoveFirstItem(const Subject& subject)
 {
@@ -277,6 +325,8 @@ std::vector<Entry> viewsEntries()
     return {
         customToolBar(),
         valueClass("DropPosition", "views/DropPosition.h"),
+        fadeStripeView(),
+        valueClass("FadeStripeViewController", "views/FadeStripeViewController.h"),
         fadeView(),
         navigationViewController(),
         valueClass("PanelGeometry", "views/PanelGeometry.h"),
