@@ -54,7 +54,9 @@ Item::Item(QWidget* parent, QFlags<EItemFlag> flags, int id, const QString& obje
     , m_flags(flags)
     , m_dragMimeType(QStringLiteral("text/plain"))
 {
-    qRegisterMetaType<vx::PopoverWidget::EItemPerformedFlags>("vx::PopoverWidget::EItemPerformedFlags");
+    static const int s_flagsType
+        = qRegisterMetaType<vx::PopoverWidget::EItemPerformedFlags>("vx::PopoverWidget::EItemPerformedFlags");
+    Q_UNUSED(s_flagsType)
 
     m_busyWidget = new BadgeWidget(this);
     m_busyWidget->setObjectName(QStringLiteral("popoverBusy"));
