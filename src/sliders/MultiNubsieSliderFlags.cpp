@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// A slider with any number of handles: the two flags. The client places them, the slider gives them their pictures.
+// A slider with any number of handles: the two flags. The client places them, the slider gives them their
+// pictures.
 #include "sliders/MultiNubsieSlider.h"
 #include "sliders/SliderDecoration.h"
 

@@ -59,7 +59,8 @@ void MultiNubsieSlider::paintEvent(QPaintEvent* event)
         palette.setCurrentColorGroup(isActiveWindow() ? QPalette::Active : QPalette::Inactive);
         painter.setPen(palette.color(foregroundRole()));
     }
-    painter.fillRect(QRect(0, 0, option.rect.width() - 1, option.rect.height() - 1), palette.color(QPalette::Window));
+    painter.fillRect(
+        QRect(0, 0, option.rect.width() - 1, option.rect.height() - 1), palette.color(QPalette::Window));
     if (m_drawTrack) {
         const QRectF bar = sliderBarRect();
         painter.fillRect(bar, palette.color(QPalette::WindowText));

@@ -14,8 +14,7 @@ namespace vx
 {
 namespace
 {
-template<typename Thing>
-Thing nubsieEntry(const QMap<ValueRange, Thing>& map, int value, const Thing& fallback)
+template <typename Thing> Thing nubsieEntry(const QMap<ValueRange, Thing>& map, int value, const Thing& fallback)
 {
     const Thing* const found = NubsieMath::entryFor(map, value);
     return found != nullptr ? *found : fallback;
@@ -316,8 +315,8 @@ void Nubsie::setDate(const QDateTime& date)
 
 QDateTime Nubsie::getDate() const
 {
-    return QDateTime::fromMSecsSinceEpoch(NubsieMath::dateOfPlace(m_startDate.toMSecsSinceEpoch(),
-                                              m_endDate.toMSecsSinceEpoch(), m_normalizedValue))
+    return QDateTime::fromMSecsSinceEpoch(
+        NubsieMath::dateOfPlace(m_startDate.toMSecsSinceEpoch(), m_endDate.toMSecsSinceEpoch(), m_normalizedValue))
         .toLocalTime();
 }
 
@@ -538,8 +537,8 @@ void Nubsie::showValuePopover()
 {
     const QPointer<PopoverWidget::Controller> controller = getController();
     if (!controller.isNull()) {
-        vx::connect(controller, "2itemPerformed(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)", this,
-            "1handlePopoverAction(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)",
+        vx::connect(controller, "2itemPerformed(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)",
+            this, "1handlePopoverAction(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)",
             Qt::UniqueConnection);
         vx::connect(controller, "2popoverWillDisappear()", this, "2valuePopoverClosing()", Qt::UniqueConnection);
     }

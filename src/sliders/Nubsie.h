@@ -11,8 +11,8 @@
 
 #include <QtCore/QDateTime>
 #include <QtCore/QMap>
-#include <QtCore/QPointF>
 #include <QtCore/QPointer>
+#include <QtCore/QPointF>
 #include <QtCore/QPropertyAnimation>
 #include <QtCore/QSize>
 #include <QtCore/QString>
@@ -29,8 +29,8 @@ namespace vx
 {
 class MultiNubsieSlider;
 
-/// A draggable handle of a MultiNubsieSlider: a small widget that paints an icon or a badge and knows its value, its
-/// range, the dates at both ends of the range, and what is to be called when it is pressed, clicked, dragged,
+/// A draggable handle of a MultiNubsieSlider: a small widget that paints an icon or a badge and knows its value,
+/// its range, the dates at both ends of the range, and what is to be called when it is pressed, clicked, dragged,
 /// long-clicked, double-clicked or released.
 ///
 /// It takes no mouse events: the slider finds the handle under the pointer and drives it. Nor is it a child of its
@@ -41,7 +41,8 @@ class MultiNubsieSlider;
 /// pushed apart. The slider maps the latter to getPosition().
 ///
 /// A handle without a size is not seen: set setSize() and, so that it grows while held, setDraggedSize(). It owns
-/// neither its parent nor its slider nor its clip widget. All sizes and positions are logical pixels. GUI thread only.
+/// neither its parent nor its slider nor its clip widget. All sizes and positions are logical pixels. GUI thread
+/// only.
 class ZELKOV_WIDGETS_EXPORT Nubsie : public QWidget, public PopoverBalloonWidget
 {
     Q_OBJECT
@@ -58,26 +59,26 @@ class ZELKOV_WIDGETS_EXPORT Nubsie : public QWidget, public PopoverBalloonWidget
     Q_PROPERTY(double glowOpacity READ getGlowOpacity WRITE setGlowOpacity)
 
 public:
-    /// What a handle can do. Some features are read as they were set by setFeatures(), others as they are in force at
-    /// the present value, see setFeatureMap().
+    /// What a handle can do. Some features are read as they were set by setFeatures(), others as they are in force
+    /// at the present value, see setFeatureMap().
     enum ENubsieFeatures : int
     {
-        enfDraggable = 0x0001,           ///< can be hit at all
-        enfMoveable = 0x0002,            ///< reported by isMoveable(), tested by nobody here
-        enfValueBadge = 0x0004,          ///< shows its value as a badge
-        enfLiveDrag = 0x0008,            ///< a drag reports each change of the value, not only the last one
-        enfBalloon = 0x0010,             ///< shows the text or item for its value in a balloon, kept up to date
-        enfRequestedBalloon = 0x0020,    ///< the same, but only when updateBalloon() is called
-        enfDateMode = 0x0040,            ///< stands for a date between the start and the end date
-        enfResetOnDoubleClick = 0x0080,  ///< a double click goes back to the default value
-        enfResetOnRelease = 0x0100,      ///< a drag ends at the default value, like a spring
-        enfLongClick = 0x0200,           ///< can be long-clicked
-        enfHoldAfterLongClick = 0x0400,  ///< stays held after the long click
-        enfStepOnClick = 0x0800,         ///< a click that no slot took steps the value up by one, around the end
-        enfStepOnFlick = 0x1000,         ///< a fast release steps the value once more
-        enfDiscreteSteps = 0x2000,       ///< drags by the handle's size a step; excludes both steps above
-        enfInverted = 0x4000,            ///< the user sees minimum + maximum - value
-        enfValuePopover = 0x8000,        ///< a click opens the item for the value, if there is one
+        enfDraggable = 0x0001, ///< can be hit at all
+        enfMoveable = 0x0002, ///< reported by isMoveable(), tested by nobody here
+        enfValueBadge = 0x0004, ///< shows its value as a badge
+        enfLiveDrag = 0x0008, ///< a drag reports each change of the value, not only the last one
+        enfBalloon = 0x0010, ///< shows the text or item for its value in a balloon, kept up to date
+        enfRequestedBalloon = 0x0020, ///< the same, but only when updateBalloon() is called
+        enfDateMode = 0x0040, ///< stands for a date between the start and the end date
+        enfResetOnDoubleClick = 0x0080, ///< a double click goes back to the default value
+        enfResetOnRelease = 0x0100, ///< a drag ends at the default value, like a spring
+        enfLongClick = 0x0200, ///< can be long-clicked
+        enfHoldAfterLongClick = 0x0400, ///< stays held after the long click
+        enfStepOnClick = 0x0800, ///< a click that no slot took steps the value up by one, around the end
+        enfStepOnFlick = 0x1000, ///< a fast release steps the value once more
+        enfDiscreteSteps = 0x2000, ///< drags by the handle's size a step; excludes both steps above
+        enfInverted = 0x4000, ///< the user sees minimum + maximum - value
+        enfValuePopover = 0x8000, ///< a click opens the item for the value, if there is one
     };
     Q_FLAG(ENubsieFeatures)
 
@@ -91,17 +92,18 @@ public:
     static constexpr int s_InvalidNubsieID = -1;
     /// Milliseconds of one pulse of the glow.
     static constexpr unsigned int s_DefaultBlinkDuration = 1500;
-    /// How far, in pixels and along each axis, the pointer may leave the press before a long click is given up. For
-    /// all handles of the process; 30 at first.
+    /// How far, in pixels and along each axis, the pointer may leave the press before a long click is given up.
+    /// For all handles of the process; 30 at first.
     static unsigned int s_LongClickMaxMoveThreshold;
     /// The meta-type of NubsieID.
     static const int qMetaTypes;
 
     /// A negative @p id takes the next free number of a counter shared by all handles that starts at 0. The object
     /// name is @p name. @p value is held in the range.
-    Nubsie(const QString& name, int value, int minimum, int maximum, int defaultValue, QWidget* parent, int id = -1);
-    /// A handle without a name, with the range of int, a default value of -1 and no sensible value: set a range and a
-    /// value before use.
+    Nubsie(
+        const QString& name, int value, int minimum, int maximum, int defaultValue, QWidget* parent, int id = -1);
+    /// A handle without a name, with the range of int, a default value of -1 and no sensible value: set a range
+    /// and a value before use.
     explicit Nubsie(QWidget* parent);
     ~Nubsie() override;
 
@@ -111,8 +113,8 @@ public:
     QString toolTipText() const;
     void setToolTipText(const QString& text);
 
-    // Looks. Of several sources the first one there is wins: the value badge, the text badge, the icon by value, the
-    // icon. Whatever wins overwrites icon().
+    // Looks. Of several sources the first one there is wins: the value badge, the text badge, the icon by value,
+    // the icon. Whatever wins overwrites icon().
 
     QPixmap icon() const;
     /// Does nothing for the pixmap that is already set.
@@ -138,8 +140,8 @@ public:
     /// The items of the value popover and of the balloon. Empties the present balloon's container first.
     void setItemMap(const QMap<ValueRange, QPointer<PopoverWidget::Item>>& map);
     QMap<ValueRange, QPointer<PopoverWidget::Item>> itemMap() const;
-    /// Opens the balloon at the item for the value as shown to the user, with the items that lie in the range. From
-    /// then on what the user picks is taken over as the value, see valueChangedbyPopover().
+    /// Opens the balloon at the item for the value as shown to the user, with the items that lie in the range.
+    /// From then on what the user picks is taken over as the value, see valueChangedbyPopover().
     void showValuePopover();
     /// Only lets values select no items any more; what is open stays open.
     void hideValuePopover();
@@ -148,11 +150,12 @@ public:
 
     /// Initially enfDraggable, enfMoveable and enfLiveDrag.
     void setFeatures(QFlags<ENubsieFeatures> features);
-    /// Features for stretches of the scale. The first range that holds the value counts, and setFeatures() where none
-    /// does. Takes effect with the next gesture.
+    /// Features for stretches of the scale. The first range that holds the value counts, and setFeatures() where
+    /// none does. Takes effect with the next gesture.
     void setFeatureMap(const QMap<ValueRange, ENubsieFeatures>& map);
     /// The same for a map of flags.
-    template<typename Features, typename = std::enable_if_t<std::is_same<Features, QFlags<ENubsieFeatures>>::value>>
+    template <typename Features,
+        typename = std::enable_if_t<std::is_same<Features, QFlags<ENubsieFeatures>>::value>>
     void setFeatureMap(const QMap<ValueRange, Features>& map);
     /// The features in force at the present value.
     QFlags<ENubsieFeatures> getCurrentFeature() const;
@@ -168,9 +171,9 @@ public:
 
     /// The value from minimum to maximum; under enfInverted, unless @p raw, the one that the user sees.
     int value(bool raw = false) const;
-    /// Holds the value in the range, ends running animations of size and position at once (the handle shrinks), and
-    /// repaints. Without @p updateDisplay the handle stays where it is drawn. Emits valueChanged(), also for the
-    /// present value, unless @p emitSignal is false.
+    /// Holds the value in the range, ends running animations of size and position at once (the handle shrinks),
+    /// and repaints. Without @p updateDisplay the handle stays where it is drawn. Emits valueChanged(), also for
+    /// the present value, unless @p emitSignal is false.
     void setValue(int value, bool emitSignal = true, bool updateDisplay = true);
     int defaultValue() const;
     void setDefaultValue(int value);
@@ -200,11 +203,12 @@ public:
     void setDate(const QDateTime& date);
     /// The date of the normalised value, in local time.
     QDateTime getDate() const;
-    /// Whether the balloon of a date handle shows the interval anchorTimeDiff() instead of a date. Ends with the next
-    /// drag.
+    /// Whether the balloon of a date handle shows the interval anchorTimeDiff() instead of a date. Ends with the
+    /// next drag.
     bool deltaTimeMode() const;
     void setDeltaTimeMode(bool on);
-    /// Whether the date differs from the anchor: the handle shows its red icon. Stored only. Ends with the next drag.
+    /// Whether the date differs from the anchor: the handle shows its red icon. Stored only. Ends with the next
+    /// drag.
     bool dateDiffer() const;
     void setDateDiffer(bool differ);
     /// Milliseconds.
@@ -235,8 +239,9 @@ public:
     double getGlowOpacity() const;
     void setGlowOpacity(double opacity);
 
-    // What is called. Each slot gets the value as an int; the release slot gets the point as well. The first range of
-    // a map that holds the value counts, and the slot without a map where none does. Setting a slot keeps the map.
+    // What is called. Each slot gets the value as an int; the release slot gets the point as well. The first range
+    // of a map that holds the value counts, and the slot without a map where none does. Setting a slot keeps the
+    // map.
 
     void setClickSlot(const QtSlot& slot);
     void setClickSlotMap(const QMap<ValueRange, QtSlot>& map);
@@ -257,8 +262,9 @@ public:
 
     // Being seen.
 
-    /// The client's wish that the handle show; true at first. Without it the handle is neither painted nor hit, and
-    /// it cannot be shown, but a handle that is visible stays so. With it the handle is shown if its slider is.
+    /// The client's wish that the handle show; true at first. Without it the handle is neither painted nor hit,
+    /// and it cannot be shown, but a handle that is visible stays so. With it the handle is shown if its slider
+    /// is.
     bool externallyVisible() const;
     void setExternallyVisible(bool visible);
     /// While that slider is hidden or covered, the handle does not paint.
@@ -268,8 +274,8 @@ public:
 
     /// Paints icon and glow as paintEvent() does, in the handle's coordinates.
     void draw(QPainter& painter) const;
-    /// Brings image and size up to date with value and features. With @p balloon a handle with a balloon or in date
-    /// mode updates its balloon and keeps its image.
+    /// Brings image and size up to date with value and features. With @p balloon a handle with a balloon or in
+    /// date mode updates its balloon and keeps its image.
     void updateNubsie(bool balloon);
 
     /// The features as they were set.
@@ -287,8 +293,8 @@ Q_SIGNALS:
     /// The user has picked a value in the value popover; the true value, also under enfInverted. No valueChanged()
     /// goes with it.
     void valueChangedbyPopover(int value);
-    /// The value was set, stepped or dragged (the latter only if the integer has changed and under enfLiveDrag). The
-    /// true value, also under enfInverted.
+    /// The value was set, stepped or dragged (the latter only if the integer has changed and under enfLiveDrag).
+    /// The true value, also under enfInverted.
     void valueChanged(int value);
     /// For subclasses: the size while held has changed. Never emitted here; the slider listens to it.
     void dragSizeChanged(Nubsie* nubsie, QSize size);
@@ -300,13 +306,14 @@ public Q_SLOTS:
     /// Resizes the widget about its point.
     void setCurrentSize(QSize size);
     QPointF getPosition() const;
-    /// Moves the widget so that its middle lies one pixel to the lower right of the point, which is in the parent's
-    /// coordinates.
+    /// Moves the widget so that its middle lies one pixel to the lower right of the point, which is in the
+    /// parent's coordinates.
     void setPosition(QPointF pos);
     /// Shows the value, the date or the interval in the balloon; a hidden handle takes its balloon away.
     void updateBalloon();
     void hideBalloon();
-    /// Lets the glow pulse until stopBlinking(), one pulse taking @p duration ms; 0 and less keep the present duration.
+    /// Lets the glow pulse until stopBlinking(), one pulse taking @p duration ms; 0 and less keep the present
+    /// duration.
     void startBlinking(int duration = 0);
     /// Back to the default duration. The last glow stays until the next paint: clients rely on it.
     void stopBlinking();
@@ -429,8 +436,7 @@ private:
 Q_DECLARE_OPERATORS_FOR_FLAGS(QFlags<Nubsie::ENubsieFeatures>)
 Q_DECLARE_OPERATORS_FOR_FLAGS(QFlags<Nubsie::ENubsieState>)
 
-template<typename Features, typename>
-void Nubsie::setFeatureMap(const QMap<ValueRange, Features>& map)
+template <typename Features, typename> void Nubsie::setFeatureMap(const QMap<ValueRange, Features>& map)
 {
     QMap<ValueRange, ENubsieFeatures> plain;
     for (auto it = map.begin(); it != map.end(); ++it) {

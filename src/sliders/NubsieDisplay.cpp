@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The handle of a slider with several handles: picture, size and place, balloon, painting.
-#include "ZelkovUtils/TimeUtils.h"
 #include "indicators/BadgeDrawer.h"
 #include "popover/Controller.h"
 #include "sliders/MultiNubsieSlider.h"
 #include "sliders/Nubsie.h"
 #include "sliders/NubsieMath.h"
+#include "ZelkovUtils/TimeUtils.h"
 
 #include <QtGui/QPainter>
 #include <QtWidgets/QStyle>
@@ -139,8 +139,7 @@ void Nubsie::updateNubsie(bool balloon)
         m_icon = mapped != nullptr ? *mapped : badge(QString::number(shown, 10), true, m_textColor, m_backColor);
         fitSizesToIcon();
     } else if (!m_textMap.isEmpty()) {
-        m_icon = badge(
-            getTextFromValue(trueValue()), false, QColor(255, 255, 255, 255), QColor(246, 67, 70, 220));
+        m_icon = badge(getTextFromValue(trueValue()), false, QColor(255, 255, 255, 255), QColor(246, 67, 70, 220));
     } else if (const QPixmap* const mapped = NubsieMath::entryFor(m_iconMap, trueValue())) {
         m_icon = *mapped;
     }

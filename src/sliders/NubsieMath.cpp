@@ -26,8 +26,7 @@ double rounded(double value)
 }
 
 // The upper bound first: where the bounds are crossed the lower one wins. What is no number becomes the lower one.
-template<typename Number>
-Number heldIn(double value, Number lowest, Number highest)
+template <typename Number> Number heldIn(double value, Number lowest, Number highest)
 {
     if (value > static_cast<double>(lowest) && !(value < static_cast<double>(highest))) {
         return highest > lowest ? highest : lowest;
@@ -42,7 +41,8 @@ int toInt(double value)
 
 int toInt(qint64 value)
 {
-    return static_cast<int>(qBound<qint64>(std::numeric_limits<int>::min(), value, std::numeric_limits<int>::max()));
+    return static_cast<int>(
+        qBound<qint64>(std::numeric_limits<int>::min(), value, std::numeric_limits<int>::max()));
 }
 
 int toCoordinate(double value)
@@ -100,8 +100,8 @@ int valueOfDate(qint64 date, qint64 start, qint64 end, int minimum, int maximum)
 qint64 dateOfPlace(qint64 start, qint64 end, double place)
 {
     const double span = static_cast<double>(end) - static_cast<double>(start);
-    const qint64 elapsed = heldIn(
-        std::trunc(span * place), std::numeric_limits<qint64>::min(), std::numeric_limits<qint64>::max());
+    const qint64 elapsed
+        = heldIn(std::trunc(span * place), std::numeric_limits<qint64>::min(), std::numeric_limits<qint64>::max());
     if (elapsed > 0 && start > std::numeric_limits<qint64>::max() - elapsed) {
         return std::numeric_limits<qint64>::max();
     }

@@ -16,8 +16,7 @@ namespace vx
 namespace NubsieMath
 {
 /// The entry of the first range in key order that holds the value, or null.
-template<typename Thing>
-const Thing* entryFor(const QMap<ValueRange, Thing>& map, int value)
+template <typename Thing> const Thing* entryFor(const QMap<ValueRange, Thing>& map, int value)
 {
     for (auto it = map.constBegin(); it != map.constEnd(); ++it) {
         if (it.key().contains(value)) {
@@ -46,8 +45,8 @@ ZELKOV_WIDGETS_EXPORT int steppedDown(int value, int minimum, int maximum);
 
 // Dates, in milliseconds -----------------------------------------------------------------------------------
 
-/// The value that stands for a date, fractions cut off toward @p minimum; not held in the range. Where start and end
-/// are the same, earlier dates give the lowest int, later ones the highest and that date the minimum.
+/// The value that stands for a date, fractions cut off toward @p minimum; not held in the range. Where start and
+/// end are the same, earlier dates give the lowest int, later ones the highest and that date the minimum.
 ZELKOV_WIDGETS_EXPORT int valueOfDate(qint64 date, qint64 start, qint64 end, int minimum, int maximum);
 
 /// The date of a place on the scale from 0 to 1, fractions of a millisecond cut off toward the start.
@@ -55,15 +54,16 @@ ZELKOV_WIDGETS_EXPORT qint64 dateOfPlace(qint64 start, qint64 end, double place)
 
 // Sizes and places -----------------------------------------------------------------------------------------
 
-/// Where the top left corner of a widget of that size goes, so that its middle lies one pixel to the lower right of
+/// Where the top left corner of a widget of that size goes, so that its middle lies one pixel to the lower right
+/// of
 /// @p middle. No farther out than a widget can be large.
 ZELKOV_WIDGETS_EXPORT QPoint topLeft(const QPointF& middle, const QSize& size);
 
 /// Where a picture is drawn to stand in the middle of an area; a larger one starts at the area's edge.
 ZELKOV_WIDGETS_EXPORT QPoint iconPoint(const QSize& area, const QSize& icon);
 
-/// The size of a picture scaled into @p target with its proportions kept, at least 1 x 1. Invalid if there is nothing
-/// to scale, or if no picture has room for it (over 32767 pixels a side or 16 million in all).
+/// The size of a picture scaled into @p target with its proportions kept, at least 1 x 1. Invalid if there is
+/// nothing to scale, or if no picture has room for it (over 32767 pixels a side or 16 million in all).
 ZELKOV_WIDGETS_EXPORT QSize scaledSize(const QSize& picture, const QSize& target);
 
 /// Whether a handle has to grow wider for its badge: a wide picture on a square handle whose sizes are both set.

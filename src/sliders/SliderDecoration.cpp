@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Where a slider with several handles paints its progress and its numbers, and how large its flags are: no widgets.
+// Where a slider with several handles paints its progress and its numbers, and how large its flags are: no
+// widgets.
 #include "sliders/SliderDecoration.h"
 
 namespace vx

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Where a slider with several handles paints its progress and its numbers, and how large its flags are: no widgets.
+// Where a slider with several handles paints its progress and its numbers, and how large its flags are: no
+// widgets.
 #pragma once
 
 #include "foundation/Export.h"
@@ -12,12 +13,12 @@
 
 namespace vx
 {
-/// Pure functions behind the painting and the flags of MultiNubsieSlider. Points for texts are the left ends of their
-/// base lines.
+/// Pure functions behind the painting and the flags of MultiNubsieSlider. Points for texts are the left ends of
+/// their base lines.
 namespace SliderDecoration
 {
-/// The part of the bar that is done, in whole pixels. It runs along the width, on a vertical slider as well: clients
-/// rely on it.
+/// The part of the bar that is done, in whole pixels. It runs along the width, on a vertical slider as well:
+/// clients rely on it.
 ZELKOV_WIDGETS_EXPORT QRectF progressRect(const QRectF& bar, double progress);
 
 /// The number of the present value: below a handle, or to the right of one on a vertical slider. @p position and

@@ -16,7 +16,8 @@ namespace
 struct NubsieRow : vx::PopoverWidget::Item
 {
     explicit NubsieRow(int value)
-        : Item(nullptr, vx::PopoverWidget::eifText, value, QString::number(value), QString::number(value), QString())
+        : Item(
+            nullptr, vx::PopoverWidget::eifText, value, QString::number(value), QString::number(value), QString())
     {
         setUserData(value);
     }
@@ -70,10 +71,11 @@ Entry nubsieEntry()
     entry.create = [](QWidget* host) {
         vx::PopoverWidget::Manager::init(0);
         auto* const handle = new RobustNubsie(host);
-        return Subject{handle, handle};
+        return Subject {handle, handle};
     };
     entry.exercise = {
-        {"set", {"valueChanged"}, {call(&RobustNubsie::drag), call(&RobustNubsie::step), call(&vx::Nubsie::reset)}},
+        {"set", {"valueChanged"},
+            {call(&RobustNubsie::drag), call(&RobustNubsie::step), call(&vx::Nubsie::reset)}},
         {"pick in the popover", {"valueChangedbyPopover", "valuePopoverClosing"},
             {call(&vx::Nubsie::showValuePopover), call(&RobustNubsie::pick), call(&vx::Nubsie::hideBalloon)}},
         {"grow, glow and move", {"dragSizeChanged"},

@@ -164,13 +164,14 @@ void TestNubsie::signalsAndSlotsStandInTheirOrder()
     }
     const QStringList expected {QStringLiteral("valueChangedbyPopover(int)"), QStringLiteral("valueChanged(int)"),
         QStringLiteral("dragSizeChanged(Nubsie*,QSize)"), QStringLiteral("valuePopoverClosing()"),
-        QStringLiteral("getCurrentSize()"), QStringLiteral("setCurrentSize(QSize)"), QStringLiteral("getPosition()"),
-        QStringLiteral("setPosition(QPointF)"), QStringLiteral("updateBalloon()"), QStringLiteral("hideBalloon()"),
-        QStringLiteral("startBlinking(int)"), QStringLiteral("stopBlinking()"), QStringLiteral("isBlinking()"),
-        QStringLiteral("performLongClick()"), QStringLiteral("performClick()"), QStringLiteral("performDrag()"),
-        QStringLiteral("performDragAction()"), QStringLiteral("performDoubleClick()"),
-        QStringLiteral("performPress()"), QStringLiteral("performRelease(QPoint)"),
-        QStringLiteral("clearClickOrLongClickOccured()"), QStringLiteral("setVisible(bool)"),
+        QStringLiteral("getCurrentSize()"), QStringLiteral("setCurrentSize(QSize)"),
+        QStringLiteral("getPosition()"), QStringLiteral("setPosition(QPointF)"), QStringLiteral("updateBalloon()"),
+        QStringLiteral("hideBalloon()"), QStringLiteral("startBlinking(int)"), QStringLiteral("stopBlinking()"),
+        QStringLiteral("isBlinking()"), QStringLiteral("performLongClick()"), QStringLiteral("performClick()"),
+        QStringLiteral("performDrag()"), QStringLiteral("performDragAction()"),
+        QStringLiteral("performDoubleClick()"), QStringLiteral("performPress()"),
+        QStringLiteral("performRelease(QPoint)"), QStringLiteral("clearClickOrLongClickOccured()"),
+        QStringLiteral("setVisible(bool)"),
         QStringLiteral("handlePopoverAction(int,QVariant,QVariant,vx::PopoverWidget::EItemPerformedFlags)")};
     QCOMPARE(found, expected);
 }
@@ -181,12 +182,14 @@ void TestNubsie::everyPropertyReadsWhatWasWritten()
     const QPixmap icon = picture(Qt::blue);
     const QPixmap red = picture(Qt::red);
     const QList<QPair<const char*, QVariant>> values {{"currentSize", QSize(12, 14)}, {"defaultValue", 9},
-        {"maximum", 20}, {"minimum", 1}, {"value", 8}, {"icon", icon}, {"icon_red", red}, {"draggedSize", QSize(40, 41)},
-        {"size", QSize(20, 21)}, {"position", QPointF(3.5, 4.5)}, {"glowOpacity", 0.5}};
+        {"maximum", 20}, {"minimum", 1}, {"value", 8}, {"icon", icon}, {"icon_red", red},
+        {"draggedSize", QSize(40, 41)}, {"size", QSize(20, 21)}, {"position", QPointF(3.5, 4.5)},
+        {"glowOpacity", 0.5}};
     for (const auto& entry : values) {
         QVERIFY2(nubsie->setProperty(entry.first, entry.second), entry.first);
         if (entry.second.userType() == QMetaType::QPixmap) {
-            QCOMPARE(nubsie->property(entry.first).value<QPixmap>().cacheKey(), entry.second.value<QPixmap>().cacheKey());
+            QCOMPARE(nubsie->property(entry.first).value<QPixmap>().cacheKey(),
+                entry.second.value<QPixmap>().cacheKey());
         } else {
             QCOMPARE(nubsie->property(entry.first), entry.second);
         }
@@ -197,7 +200,8 @@ void TestNubsie::everyPropertyReadsWhatWasWritten()
         names << QString::fromLatin1(meta.property(i).name());
     }
     QCOMPARE(names.join(QLatin1Char(' ')),
-        QStringLiteral("currentSize value defaultValue maximum minimum icon icon_red size draggedSize position glowOpacity"));
+        QStringLiteral(
+            "currentSize value defaultValue maximum minimum icon icon_red size draggedSize position glowOpacity"));
 }
 
 void TestNubsie::theMouseGoesThrough()
@@ -231,8 +235,9 @@ void TestNubsie::settingAValueHoldsItInTheRangeAndTellsIt()
     nubsie->setValue(11);
     nubsie->setValue(-1);
     nubsie->setValue(4);
-    QCOMPARE(recorder.names(), QStringList({QStringLiteral("valueChanged"), QStringLiteral("valueChanged"),
-        QStringLiteral("valueChanged")}));
+    QCOMPARE(recorder.names(),
+        QStringList(
+            {QStringLiteral("valueChanged"), QStringLiteral("valueChanged"), QStringLiteral("valueChanged")}));
     QCOMPARE(recorder.entries().at(0).arguments, QVariantList({10}));
     QCOMPARE(recorder.entries().at(1).arguments, QVariantList({0}));
     QCOMPARE(recorder.entries().at(2).arguments, QVariantList({4}));
@@ -485,13 +490,18 @@ void TestNubsie::aHandleMayDieInItsOwnSignal()
     QPointer<Nubsie> nubsie = makeNubsie().release();
     connect(nubsie, &Nubsie::valueChanged, this, [nubsie] { delete nubsie.data(); });
     switch (what) {
-    case 0: ++*nubsie; break;
-    case 1: --*nubsie; break;
+    case 0:
+        ++*nubsie;
+        break;
+    case 1:
+        --*nubsie;
+        break;
     case 2:
         nubsie->setNormalizedValue(0.9);
         QVERIFY(nubsie->performDragAction());
         break;
-    default: nubsie->setDate(QDateTime::currentDateTime());
+    default:
+        nubsie->setDate(QDateTime::currentDateTime());
     }
     QVERIFY(nubsie.isNull());
 }

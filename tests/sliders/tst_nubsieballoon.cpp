@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The balloons of a handle: texts, dates, intervals, and the popover in which a value is picked.
 #include "NubsieScene.h"
-#include "ZelkovUtils/TimeUtils.h"
 #include "popover/Container.h"
 #include "popover/Controller.h"
 #include "popover/Item.h"
@@ -10,6 +9,7 @@
 #include "support/SignalRecorder.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "ZelkovUtils/TimeUtils.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QLabel>
@@ -69,7 +69,8 @@ struct Scene
     bool open() const { return controller() != nullptr && controller()->isActive(); }
     QString text() const
     {
-        const QList<QLabel*> labels = controller() != nullptr ? controller()->findChildren<QLabel*>() : QList<QLabel*>();
+        const QList<QLabel*> labels
+            = controller() != nullptr ? controller()->findChildren<QLabel*>() : QList<QLabel*>();
         for (const QLabel* const label : labels) {
             if (label->text() == expected) {
                 return expected;

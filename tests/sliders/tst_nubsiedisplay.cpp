@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // How a handle looks, grows, moves and glows.
-#include "NubsieScene.h"
 #include "indicators/BadgeDrawer.h"
+#include "NubsieScene.h"
 #include "sliders/Nubsie.h"
 #include "sliders/NubsieMath.h"
 #include "support/TestCase.h"

@@ -128,7 +128,8 @@ void TestNubsieMath::everyValueComesBackFromItsPlace()
         const int minimum = qMin(a, b);
         const int maximum = qMax(a, b);
         const auto span = static_cast<qint64>(maximum) - minimum;
-        const int value = static_cast<int>(minimum + static_cast<qint64>(random.generateDouble() * static_cast<double>(span)));
+        const int value
+            = static_cast<int>(minimum + static_cast<qint64>(random.generateDouble() * static_cast<double>(span)));
         const double place = Math::normalized(value, minimum, maximum);
         QVERIFY(place >= 0.0 && place <= 1.0);
         QCOMPARE(Math::denormalized(place, minimum, maximum), value);

@@ -112,8 +112,9 @@ void TestNubsieSlots::theFirstRangeThatHoldsTheValueWins()
         QVERIFY((nubsie.*each.perform)());
     }
     const QString own = QString::fromLatin1(each.slot);
-    QCOMPARE(receiver.calls, QStringList({own + QStringLiteral(" 2"), QStringLiteral("low 3"), QStringLiteral("low 5"),
-        QStringLiteral("high 6"), QStringLiteral("high 8"), own + QStringLiteral(" 9")}));
+    QCOMPARE(receiver.calls,
+        QStringList({own + QStringLiteral(" 2"), QStringLiteral("low 3"), QStringLiteral("low 5"),
+            QStringLiteral("high 6"), QStringLiteral("high 8"), own + QStringLiteral(" 9")}));
 }
 
 void TestNubsieSlots::aSlotInTheMapMayBeEmpty()

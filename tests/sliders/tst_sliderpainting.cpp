@@ -49,10 +49,7 @@ struct Scene
     }
 
     // The middle of the handle, in the slider's coordinates.
-    QPoint handle() const
-    {
-        return slider->nubsieRect(slider->nubsie(1)).center().toPoint() - slider->pos();
-    }
+    QPoint handle() const { return slider->nubsieRect(slider->nubsie(1)).center().toPoint() - slider->pos(); }
 
     QWidget window;
     MultiNubsieSlider* slider;
@@ -187,8 +184,9 @@ void TestSliderPainting::numbersShowOnlyWhileAHandleIsInUse()
 {
     Scene scene;
     const QImage before = scene.painted();
-    scene.slider->setFeatures(QFlags<MultiNubsieSlider::EMultiNubsieSliderFeatures>(
-        MultiNubsieSlider::emfShowRangeLabels) | MultiNubsieSlider::emfShowValueLabel);
+    scene.slider->setFeatures(
+        QFlags<MultiNubsieSlider::EMultiNubsieSliderFeatures>(MultiNubsieSlider::emfShowRangeLabels)
+        | MultiNubsieSlider::emfShowValueLabel);
     QCOMPARE(difference(before, scene.painted()), QRect());
     zelkovtest::Pointer pointer(&scene.window);
     pointer.move(scene.handle() + scene.slider->pos());
@@ -218,7 +216,11 @@ void TestSliderPainting::theNumberOfTheValueIsOffByThePlaceInTheWindow()
     // The point is in the window's coordinates and used in the slider's.
     QVERIFY(base.x() > scene.handle().x() + 40);
     QVERIFY2(qAbs(found.left() - base.x()) <= 2 && qAbs(found.bottom() + 1 - base.y()) <= 2,
-        qPrintable(QStringLiteral("%1,%2 %3x%4").arg(found.left()).arg(found.top()).arg(found.width()).arg(found.height())));
+        qPrintable(QStringLiteral("%1,%2 %3x%4")
+                       .arg(found.left())
+                       .arg(found.top())
+                       .arg(found.width())
+                       .arg(found.height())));
     pointer.release();
 }
 
