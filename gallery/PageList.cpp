@@ -95,8 +95,8 @@ const QVector<PageEntry>& pages()
          &make<PopoversPage>},
         {"panels", QT_TRANSLATE_NOOP("gallery::PageList", "Views"), QT_TRANSLATE_NOOP("gallery::PageList", "Panels"),
          QT_TRANSLATE_NOOP("gallery::PageList",
-                           "FadeView is a strip at the edge of a view that slides open, over the picture or as part "
-                           "of a layout, and can take the full height."),
+                           "FadeView is a strip at the edge of a view that slides open and can take the full "
+                           "height; FadeStripeView adds a handle, a time line and rows of contents."),
          &make<PanelsPage>},
         {"pages", QT_TRANSLATE_NOOP("gallery::PageList", "Views"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Pages and slideshow"),

@@ -834,10 +834,6 @@
         <translation>Schiebeflächen</translation>
     </message>
     <message>
-        <source>FadeView is a strip at the edge of a view that slides open, over the picture or as part of a layout, and can take the full height.</source>
-        <translation>FadeView ist ein Streifen am Rand einer Ansicht, der sich aufschiebt, über dem Bild oder als Teil eines Layouts, und die volle Höhe einnehmen kann.</translation>
-    </message>
-    <message>
         <source>Pages and slideshow</source>
         <translation>Seiten und Diaschau</translation>
     </message>
@@ -868,6 +864,10 @@
     <message>
         <source>CustomToolBar reports which action was dropped where, and which one is to go.</source>
         <translation>CustomToolBar meldet, welche Aktion wo abgelegt wurde und welche entfernt werden soll.</translation>
+    </message>
+    <message>
+        <source>FadeView is a strip at the edge of a view that slides open and can take the full height; FadeStripeView adds a handle, a time line and rows of contents.</source>
+        <translation>FadeView ist ein Streifen am Rand einer Ansicht, der sich aufschiebt und die volle Höhe einnehmen kann; FadeStripeView fügt einen Griff, eine Zeitleiste und Zeilen hinzu.</translation>
     </message>
 </context>
 <context>
@@ -972,10 +972,6 @@
         <translation>Letzte Ereignisse</translation>
     </message>
     <message>
-        <source>Other cameras</source>
-        <translation>Andere Kameras</translation>
-    </message>
-    <message>
         <source>Upper panel</source>
         <translation>Obere Fläche</translation>
     </message>
@@ -996,8 +992,12 @@
         <translation>fadein() und fadeout() mit force: nicht von da, wo die Fläche steht</translation>
     </message>
     <message>
-        <source>Click the strips, also while a panel moves.</source>
-        <translation>Klicken Sie auf die Streifen, auch während sich eine Fläche bewegt.</translation>
+        <source>Click the handles, also while a panel moves; drag the lower one.</source>
+        <translation>Klicken Sie auf die Griffe, auch während der Bewegung; den unteren können Sie ziehen.</translation>
+    </message>
+    <message>
+        <source>Time</source>
+        <translation>Zeit</translation>
     </message>
 </context>
 <context>

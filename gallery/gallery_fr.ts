@@ -834,10 +834,6 @@
         <translation>Panneaux</translation>
     </message>
     <message>
-        <source>FadeView is a strip at the edge of a view that slides open, over the picture or as part of a layout, and can take the full height.</source>
-        <translation>FadeView est une bande au bord d&apos;une vue qui s&apos;ouvre en glissant, par-dessus l&apos;image ou dans un layout, et peut prendre toute la hauteur.</translation>
-    </message>
-    <message>
         <source>Pages and slideshow</source>
         <translation>Pages et diaporama</translation>
     </message>
@@ -868,6 +864,10 @@
     <message>
         <source>CustomToolBar reports which action was dropped where, and which one is to go.</source>
         <translation>CustomToolBar signale quelle action a été déposée où, et laquelle doit partir.</translation>
+    </message>
+    <message>
+        <source>FadeView is a strip at the edge of a view that slides open and can take the full height; FadeStripeView adds a handle, a time line and rows of contents.</source>
+        <translation>FadeView est une bande au bord d&apos;une vue qui s&apos;ouvre en glissant et peut prendre toute la hauteur ; FadeStripeView ajoute une poignée, une ligne de temps et des rangées.</translation>
     </message>
 </context>
 <context>
@@ -972,10 +972,6 @@
         <translation>Derniers événements</translation>
     </message>
     <message>
-        <source>Other cameras</source>
-        <translation>Autres caméras</translation>
-    </message>
-    <message>
         <source>Upper panel</source>
         <translation>Panneau du haut</translation>
     </message>
@@ -996,8 +992,12 @@
         <translation>fadein() et fadeout() avec force : pas depuis la position du panneau</translation>
     </message>
     <message>
-        <source>Click the strips, also while a panel moves.</source>
-        <translation>Cliquez sur les bandes, même pendant le mouvement.</translation>
+        <source>Click the handles, also while a panel moves; drag the lower one.</source>
+        <translation>Cliquez sur les poignées, même pendant le mouvement ; tirez celle du bas.</translation>
+    </message>
+    <message>
+        <source>Time</source>
+        <translation>Temps</translation>
     </message>
 </context>
 <context>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Two panels over a moving picture. They place themselves, so the page tells them when the view was resized.
+// Two panels over a moving picture, the lower one with a time line. They place themselves, so the page tells them when the view was resized.
 #include "PanelsPage.h"
 
 #include <QtCore/QDateTime>
@@ -14,6 +14,8 @@
 #include "../Hand.h"
 #include "../cameras/CameraTile.h"
 #include "../cameras/Scene.h"
+#include "sliders/MultiNubsieSlider.h"
+#include "views/FadeStripeView.h"
 
 namespace gallery
 {
@@ -23,15 +25,52 @@ const int s_frameMillis = 40;
 const int s_openHeight = 118;
 const int s_pictureCount = 8;
 const QSize s_pictureSize(124, 72);
+const int s_timeNubsie = 1;
+
+QPixmap knob()
+{
+    QPixmap pixmap(44, 44);
+    pixmap.fill(Qt::transparent);
+    QPainter painter(&pixmap);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(QPen(Qt::white, 4));
+    painter.setBrush(QColor(70, 150, 245));
+    painter.drawEllipse(QRectF(3, 3, 38, 38));
+    return pixmap;
+}
+
+QVector<QPixmap> picturesOf(int seed, double ratio)
+{
+    QVector<QPixmap> result;
+    for (int i = 0; i < s_pictureCount; ++i) {
+        const QSize whole(qRound(s_pictureSize.width() / Scene::s_width), s_pictureSize.height());
+        result.append(Scene(seed + i).ground(whole, ratio));
+    }
+    return result;
+}
+}
+
+PictureRows::PictureRows(QWidget* parent)
+    : QWidget(parent), m_pictures(picturesOf(14, devicePixelRatioF()))
+{
+}
+
+void PictureRows::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    painter.fillRect(rect(), QColor(22, 26, 32));
+    int number = 0;
+    for (int y = 6; y < height(); y += s_rowHeight) {
+        for (int x = 12; x < width(); x += s_pictureSize.width() + 8) {
+            painter.drawPixmap(x, y, m_pictures.at(number++ % m_pictures.size()));
+        }
+    }
 }
 
 PicturePanel::PicturePanel(EPositions position, const QString& caption, int seed, QWidget* parent)
     : FadeView(position, nullptr, parent), m_caption(caption)
 {
-    for (int i = 0; i < s_pictureCount; ++i) {
-        const QSize whole(qRound(s_pictureSize.width() / Scene::s_width), s_pictureSize.height());
-        m_pictures.append(Scene(seed + i).ground(whole, devicePixelRatioF()));
-    }
+    m_pictures = picturesOf(seed, devicePixelRatioF());
     setAutoFillBackground(false);
     setCursor(Qt::PointingHandCursor);
 }
@@ -78,27 +117,38 @@ PanelsPage::PanelsPage(SignalLog& log, QWidget* parent)
     m_view->setMinimumHeight(300);
     m_camera = new CameraTile(tr("North gate"), 3, m_view);
     m_top = new PicturePanel(FadeView::ePositionTop, tr("Latest events"), 4, m_view);
-    m_bottom = new PicturePanel(FadeView::ePositionBottom, tr("Other cameras"), 14, m_view);
-    for (PicturePanel* panel : {m_top, m_bottom}) {
-        panel->setFadeStripeAsPartOfLayout(false);
-        panel->setSizeHint(c_Bordersize, true);
-        panel->show();
-        watch(panel, panel == m_top ? QStringLiteral("top") : QStringLiteral("bottom"),
-              {QStringLiteral("geometryChanged")});
-        announcePlace(panel, panel == m_top ? QStringLiteral("top") : QStringLiteral("bottom"));
-        connect(panel, &PicturePanel::stripClicked, this, [this, panel] { toggle(panel); });
-    }
+    m_top->setFadeStripeAsPartOfLayout(false);
+    m_top->setSizeHint(c_Bordersize, true);
+    m_top->show();
+    connect(m_top, &PicturePanel::stripClicked, this, [this] { toggle(m_top); });
+    watch(m_top, QStringLiteral("top"), {QStringLiteral("geometryChanged")});
     m_view->installEventFilter(this);
 
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(12);
     layout->addWidget(m_view, 1);
+    m_bottom = makeStripe();
     layout->addWidget(makeSettings());
 
     m_frames.setInterval(s_frameMillis);
     connect(&m_frames, &QTimer::timeout, m_camera,
             [this] { m_camera->advance(QDateTime::currentMSecsSinceEpoch()); });
+}
+
+FadeStripeView* PanelsPage::makeStripe()
+{
+    auto* stripe = new FadeStripeView(FadeView::ePositionBottom, new PictureRows, m_view);
+    stripe->setFadeStripeAsPartOfLayout(false);
+    stripe->setMaximumHeight(c_Bordersize * 2 + PictureRows::s_rowHeight * 2);
+    stripe->setContentsHeight(PictureRows::s_rowHeight);
+    stripe->setStyleDefault();
+    stripe->setRows(0);
+    stripe->show();
+    watch(stripe, QStringLiteral("bottom"),
+          {QStringLiteral("geometryChanged"), QStringLiteral("sizeChanged"), QStringLiteral("heightChanged")});
+    announcePlace(stripe, QStringLiteral("bottom"));
+    return stripe;
 }
 
 QWidget* PanelsPage::makeSettings()
@@ -126,18 +176,18 @@ QWidget* PanelsPage::makeSettings()
     layout->addSpacing(8);
     layout->addWidget(m_animated);
     layout->addStretch(1);
-    layout->addWidget(label(tr("Click the strips, also while a panel moves."), "hint"));
+    layout->addWidget(label(tr("Click the handles, also while a panel moves; drag the lower one."), "hint"));
     return row;
 }
 
-void PanelsPage::toggle(PicturePanel* panel)
+void PanelsPage::toggle(FadeView* panel)
 {
     if (panel->isFullscreen()) {
         panel->exitFullscreen(true);
     } else if (panel->isFadedIn()) {
         panel->fadeout(true, m_animated->isChecked());
     } else {
-        panel->fadein(true, m_animated->isChecked(), s_openHeight);
+        panel->fadein(true, m_animated->isChecked(), panel == m_top ? s_openHeight : -1);
     }
 }
 
@@ -154,6 +204,14 @@ bool PanelsPage::eventFilter(QObject* object, QEvent* event)
 
 void PanelsPage::showEvent(QShowEvent* event)
 {
+    // Only now: the handles of a time line live in its window.
+    vx::MultiNubsieSlider* slider = m_bottom->slider();
+    if (!slider->nubsieExists(s_timeNubsie)) {
+        slider->addNubsie(tr("Time"), 70, 0, 100, s_timeNubsie);
+        slider->setStandardSize(s_timeNubsie, QSize(13, 13));
+        slider->setDraggedSize(s_timeNubsie, QSize(22, 22));
+        slider->setIcon(s_timeNubsie, knob());
+    }
     m_frames.start();
     Page::showEvent(event);
 }
@@ -167,6 +225,8 @@ void PanelsPage::hideEvent(QHideEvent* event)
 void PanelsPage::rehearse(Hand& hand)
 {
     hand.click(m_top, m_top->rect().center()).wait(450);
-    hand.click(m_bottom, QPoint(m_bottom->width() / 2, 7)).wait(160);
+    const QPoint bar(m_bottom->width() / 3, 7);
+    hand.moveTo(m_bottom, bar).press();
+    hand.glideTo(m_view, QPoint(bar.x(), m_view->height() - 190), 300).wait(40).release().wait(400);
 }
 }

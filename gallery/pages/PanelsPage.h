@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Page "Panels": FadeView at both edges of a live picture.
+// Page "Panels": FadeView and FadeStripeView over a live picture.
 #pragma once
 
 #include <QtCore/QTimer>
@@ -7,6 +7,8 @@
 
 #include "../Page.h"
 #include "views/FadeView.h"
+
+class FadeStripeView;
 
 namespace gallery
 {
@@ -35,6 +37,23 @@ private:
     QVector<QPixmap> m_pictures;
 };
 
+/// Rows of small pictures, as many as there is height for: the contents of the stripe.
+class PictureRows : public QWidget
+{
+    Q_OBJECT
+
+public:
+    static const int s_rowHeight = 84;
+
+    explicit PictureRows(QWidget* parent = nullptr);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    QVector<QPixmap> m_pictures;
+};
+
 class PanelsPage : public Page
 {
     Q_OBJECT
@@ -51,12 +70,13 @@ protected:
 
 private:
     QWidget* makeSettings();
-    void toggle(PicturePanel* panel);
+    FadeStripeView* makeStripe();
+    void toggle(FadeView* panel);
 
     QWidget* m_view;
     CameraTile* m_camera;
     PicturePanel* m_top;
-    PicturePanel* m_bottom;
+    FadeStripeView* m_bottom;
     QCheckBox* m_animated = nullptr;
     QTimer m_frames;
 };
