@@ -669,10 +669,17 @@ void TestMultiNubsieGestures::aStepThatChangedTheValueIsNoFlick()
     pointer.release();
     QCOMPARE(scene.slider->value(1), 179);
 
-    // Nor is any with discrete steps.
+    // Nor is any with discrete steps, however fast the last move was before that.
     scene.slider->setRange(1, 0, 1);
-    scene.slider->addFeatures(1, Nubsie::enfDiscreteSteps);
+    scene.slider->setFeatures(1, Nubsie::enfDraggable);
     QCOMPARE(scene.slider->value(1), 1);
+    pointer.wait(1000);
+    pointer.move(QPoint(209, 17));
+    pointer.press();
+    pointer.move(QPoint(209 - 90, 17));
+    pointer.release();
+    QCOMPARE(scene.slider->value(1), 1);
+    scene.slider->addFeatures(1, Nubsie::enfStepOnFlick | Nubsie::enfDiscreteSteps);
     pointer.wait(1000);
     pointer.move(QPoint(209, 17));
     pointer.press();
