@@ -6,11 +6,15 @@
 
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
-#include "pages/FadesPage.h"
 #include "pages/ClickVariantsPage.h"
+#include "pages/CountingLinesPage.h"
 #include "pages/DeviceBrowserPage.h"
+#include "pages/EditsPage.h"
+#include "pages/FadesPage.h"
+#include "pages/FramesPage.h"
 #include "pages/LabelsPage.h"
 #include "pages/MouseGesturesPage.h"
+#include "pages/OverlaysPage.h"
 #include "pages/PopoversPage.h"
 #include "pages/PanelsPage.h"
 #include "pages/PagesPage.h"
@@ -18,6 +22,7 @@
 #include "pages/RubberBandPage.h"
 #include "pages/ToolBarPage.h"
 #include "pages/ScrollBarsPage.h"
+#include "pages/TimeLabelsPage.h"
 #include "pages/TimeLinePage.h"
 
 namespace gallery
@@ -75,6 +80,23 @@ const QVector<PageEntry>& pages()
                            "ElidedLabel and ElidedButton shorten their text to the room they have; Label covers "
                            "itself with a picture that keeps its proportions."),
          &make<LabelsPage>},
+        {"overlays", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Overlays"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "BusyOverlayView tells that a connection has gone and for how long; IconOverlayView "
+                           "shows a sign for a moment and deletes itself."),
+         &make<OverlaysPage>},
+        {"time-labels", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Time labels"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "TimeLabel shows the time of a picture and lets it be edited; NameTimeLabel drops "
+                           "what has no room."),
+         &make<TimeLabelsPage>},
+        {"frames", QT_TRANSLATE_NOOP("gallery::PageList", "Indicators"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Frames"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "BorderIcon cuts a small picture into nine parts and fills any rectangle with it."),
+         &make<FramesPage>},
         {"scroll-bars", QT_TRANSLATE_NOOP("gallery::PageList", "Sliders"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Scroll bars"),
          QT_TRANSLATE_NOOP("gallery::PageList",
@@ -120,6 +142,18 @@ const QVector<PageEntry>& pages()
          QT_TRANSLATE_NOOP("gallery::PageList",
                            "CustomToolBar reports which action was dropped where, and which one is to go."),
          &make<ToolBarPage>},
+        {"edits", QT_TRANSLATE_NOOP("gallery::PageList", "Controls"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Edits"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "Fields for search words, folders and times, and a combo box that leaves the wheel to "
+                           "the form around it."),
+         &make<EditsPage>},
+        {"counting-lines", QT_TRANSLATE_NOOP("gallery::PageList", "Controls"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Counting lines"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is "
+                           "counted."),
+         &make<CountingLinesPage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

@@ -346,6 +346,25 @@
     </message>
 </context>
 <context>
+    <name>gallery::CountingLinesPage</name>
+    <message>
+        <source>Main entrance</source>
+        <translation>Haupteingang</translation>
+    </message>
+    <message>
+        <source>Outside</source>
+        <translation>Draußen</translation>
+    </message>
+    <message>
+        <source>Inside</source>
+        <translation>Drinnen</translation>
+    </message>
+    <message>
+        <source>Drag the ends of the line in the picture, or change the numbers.</source>
+        <translation>Die Enden der Linie im Bild ziehen oder die Zahlen ändern.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::DeviceBrowserPage</name>
     <message>
         <source>North gate</source>
@@ -406,6 +425,101 @@
     <message>
         <source>%1 of %2 devices, %3 ms</source>
         <translation>%1 von %2 Geräten, %3 ms</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::EditsPage</name>
+    <message>
+        <source>Search</source>
+        <translation>Suche</translation>
+    </message>
+    <message>
+        <source>Find a camera</source>
+        <translation>Kamera suchen</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Tor</translation>
+    </message>
+    <message>
+        <source>Yard</source>
+        <translation>Hof</translation>
+    </message>
+    <message>
+        <source>Hall</source>
+        <translation>Halle</translation>
+    </message>
+    <message>
+        <source>Ramp</source>
+        <translation>Rampe</translation>
+    </message>
+    <message>
+        <source>Stairs</source>
+        <translation>Treppe</translation>
+    </message>
+    <message>
+        <source>north</source>
+        <translation>Nord</translation>
+    </message>
+    <message>
+        <source>east</source>
+        <translation>Ost</translation>
+    </message>
+    <message>
+        <source>south</source>
+        <translation>Süd</translation>
+    </message>
+    <message>
+        <source>west</source>
+        <translation>West</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Export</translation>
+    </message>
+    <message>
+        <source>Read only</source>
+        <translation>Nur lesen</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <translation>Ordner</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>Von</translation>
+    </message>
+    <message>
+        <source>To</source>
+        <translation>Bis</translation>
+    </message>
+    <message>
+        <source>Drop a file on the folder: its folder is taken. The cross brings the end back.</source>
+        <translation>Eine Datei auf den Ordner fallen lassen: Ihr Ordner wird genommen. Das Kreuz bringt das Ende zurück.</translation>
+    </message>
+    <message>
+        <source>A form that scrolls</source>
+        <translation>Ein Formular, das rollt</translation>
+    </message>
+    <message>
+        <source>The wheel over a combo box scrolls the form and changes nothing.</source>
+        <translation>Das Mausrad über einer Auswahl rollt das Formular und ändert nichts.</translation>
+    </message>
+    <message>
+        <source>25 pictures a second</source>
+        <translation>25 Bilder je Sekunde</translation>
+    </message>
+    <message>
+        <source>12 pictures a second</source>
+        <translation>12 Bilder je Sekunde</translation>
+    </message>
+    <message>
+        <source>1 picture a second</source>
+        <translation>1 Bild je Sekunde</translation>
+    </message>
+    <message>
+        <source>Camera %1</source>
+        <translation>Kamera %1</translation>
     </message>
 </context>
 <context>
@@ -489,6 +603,41 @@
     <message>
         <source>shadow</source>
         <translation>Schatten</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::FramesPage</name>
+    <message>
+        <source>The picture: %1 × %1 pixels, cut %2 pixels from each side</source>
+        <translation>Das Bild: %1 × %1 Pixel, %2 Pixel von jeder Seite geschnitten</translation>
+    </message>
+    <message>
+        <source>Stretch the centre</source>
+        <translation>Mitte strecken</translation>
+    </message>
+    <message>
+        <source>The border keeps its width.</source>
+        <translation>Der Rand behält seine Breite.</translation>
+    </message>
+    <message>
+        <source>Tile the centre</source>
+        <translation>Mitte kacheln</translation>
+    </message>
+    <message>
+        <source>Stretch the border</source>
+        <translation>Rand strecken</translation>
+    </message>
+    <message>
+        <source>The centre keeps its size.</source>
+        <translation>Die Mitte behält ihre Größe.</translation>
+    </message>
+    <message>
+        <source>Tile the border</source>
+        <translation>Rand kacheln</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Deckkraft</translation>
     </message>
 </context>
 <context>
@@ -720,6 +869,57 @@
     </message>
 </context>
 <context>
+    <name>gallery::OverlaysPage</name>
+    <message>
+        <source>Connection</source>
+        <translation>Verbindung</translation>
+    </message>
+    <message>
+        <source>Cut the line</source>
+        <translation>Leitung trennen</translation>
+    </message>
+    <message>
+        <source>Count the seconds</source>
+        <translation>Sekunden zählen</translation>
+    </message>
+    <message>
+        <source>Another text, %1 is the time</source>
+        <translation>Anderer Text, %1 ist die Zeit</translation>
+    </message>
+    <message>
+        <source>The spinner comes a second later: a short loss shows nothing.</source>
+        <translation>Das Drehzeichen kommt eine Sekunde später: Ein kurzer Ausfall zeigt nichts.</translation>
+    </message>
+    <message>
+        <source>Signs</source>
+        <translation>Zeichen</translation>
+    </message>
+    <message>
+        <source>Play</source>
+        <translation>Wiedergabe</translation>
+    </message>
+    <message>
+        <source>Pause</source>
+        <translation>Pause</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Text</translation>
+    </message>
+    <message>
+        <source>Start of the recording</source>
+        <translation>Anfang der Aufnahme</translation>
+    </message>
+    <message>
+        <source>Icon and text</source>
+        <translation>Symbol und Text</translation>
+    </message>
+    <message>
+        <source>Picture saved</source>
+        <translation>Bild gespeichert</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -869,6 +1069,50 @@
         <source>FadeView is a strip at the edge of a view that slides open and can take the full height; FadeStripeView adds a handle, a time line and rows of contents.</source>
         <translation>FadeView ist ein Streifen am Rand einer Ansicht, der sich aufschiebt und die volle Höhe einnehmen kann; FadeStripeView fügt einen Griff, eine Zeitleiste und Zeilen hinzu.</translation>
     </message>
+    <message>
+        <source>Overlays</source>
+        <translation>Einblendungen</translation>
+    </message>
+    <message>
+        <source>BusyOverlayView tells that a connection has gone and for how long; IconOverlayView shows a sign for a moment and deletes itself.</source>
+        <translation>BusyOverlayView meldet, dass eine Verbindung weg ist und wie lange; IconOverlayView zeigt kurz ein Zeichen und löscht sich selbst.</translation>
+    </message>
+    <message>
+        <source>Time labels</source>
+        <translation>Zeitanzeigen</translation>
+    </message>
+    <message>
+        <source>TimeLabel shows the time of a picture and lets it be edited; NameTimeLabel drops what has no room.</source>
+        <translation>TimeLabel zeigt die Zeit eines Bildes und lässt sie ändern; NameTimeLabel lässt weg, was keinen Platz hat.</translation>
+    </message>
+    <message>
+        <source>Frames</source>
+        <translation>Rahmen</translation>
+    </message>
+    <message>
+        <source>BorderIcon cuts a small picture into nine parts and fills any rectangle with it.</source>
+        <translation>BorderIcon schneidet ein kleines Bild in neun Teile und füllt damit jedes Rechteck.</translation>
+    </message>
+    <message>
+        <source>Controls</source>
+        <translation>Bedienelemente</translation>
+    </message>
+    <message>
+        <source>Edits</source>
+        <translation>Eingabefelder</translation>
+    </message>
+    <message>
+        <source>Fields for search words, folders and times, and a combo box that leaves the wheel to the form around it.</source>
+        <translation>Felder für Suchwörter, Ordner und Zeiten, und eine Auswahl, die das Mausrad dem Formular überlässt.</translation>
+    </message>
+    <message>
+        <source>Counting lines</source>
+        <translation>Zähllinien</translation>
+    </message>
+    <message>
+        <source>VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is counted.</source>
+        <translation>VxCountingLinesGroupBox bearbeitet eine Linie im Bild; wer sie überquert, wird gezählt.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>
@@ -1001,6 +1245,120 @@
     </message>
 </context>
 <context>
+    <name>gallery::PasswordPage</name>
+    <message>
+        <source>New password</source>
+        <translation>Neues Passwort</translation>
+    </message>
+    <message>
+        <source>Once more</source>
+        <translation>Noch einmal</translation>
+    </message>
+    <message>
+        <source>Password of the camera</source>
+        <translation>Passwort der Kamera</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Start again</source>
+        <translation>Von vorn</translation>
+    </message>
+    <message>
+        <source>What is asked of it</source>
+        <translation>Was verlangt wird</translation>
+    </message>
+    <message>
+        <source>%1 characters or more</source>
+        <translation>%1 Zeichen oder mehr</translation>
+    </message>
+    <message>
+        <source>A small and a capital letter</source>
+        <translation>Ein kleiner und ein großer Buchstabe</translation>
+    </message>
+    <message>
+        <source>A digit and a letter</source>
+        <translation>Eine Ziffer und ein Buchstabe</translation>
+    </message>
+    <message>
+        <source>A special character</source>
+        <translation>Ein Sonderzeichen</translation>
+    </message>
+    <message>
+        <source>Not used before (Camera_2025 was)</source>
+        <translation>Nicht schon benutzt (Camera_2025 war es)</translation>
+    </message>
+    <message>
+        <source>The same both times</source>
+        <translation>Beide Male dasselbe</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PhoneListPage</name>
+    <message>
+        <source>Gate west</source>
+        <translation>Tor West</translation>
+    </message>
+    <message>
+        <source>Yard north</source>
+        <translation>Hof Nord</translation>
+    </message>
+    <message>
+        <source>Entrance hall</source>
+        <translation>Eingangshalle</translation>
+    </message>
+    <message>
+        <source>Ramp</source>
+        <translation>Rampe</translation>
+    </message>
+    <message>
+        <source>Stairs</source>
+        <translation>Treppe</translation>
+    </message>
+    <message>
+        <source>Roof</source>
+        <translation>Dach</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>getrennt</translation>
+    </message>
+    <message>
+        <source>online</source>
+        <translation>verbunden</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Bearbeiten</translation>
+    </message>
+    <message>
+        <source>Add a camera</source>
+        <translation>Kamera hinzufügen</translation>
+    </message>
+    <message>
+        <source>Camera %1</source>
+        <translation>Kamera %1</translation>
+    </message>
+    <message>
+        <source>Keep the last one</source>
+        <translation>Die letzte behalten</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>Geräte</translation>
+    </message>
+    <message>
+        <source>While you edit: the red sign brings out a button that deletes the row, a row is dragged to another place, and its name can be changed.</source>
+        <translation>Beim Bearbeiten: Das rote Zeichen bringt einen Knopf hervor, der die Zeile löscht, eine Zeile lässt sich an eine andere Stelle ziehen, und ihr Name ist änderbar.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PopoversPage</name>
     <message>
         <source>Camera %1</source>
@@ -1117,6 +1475,45 @@
     <message>
         <source>Dropped: %1</source>
         <translation>Abgelegt: %1</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PtzPage</name>
+    <message>
+        <source>to the left</source>
+        <translation>nach links</translation>
+    </message>
+    <message>
+        <source>to the right</source>
+        <translation>nach rechts</translation>
+    </message>
+    <message>
+        <source>down</source>
+        <translation>nach unten</translation>
+    </message>
+    <message>
+        <source>up</source>
+        <translation>nach oben</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Kamera</translation>
+    </message>
+    <message>
+        <source>Pan</source>
+        <translation>Schwenken</translation>
+    </message>
+    <message>
+        <source>Tilt</source>
+        <translation>Neigen</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <translation>Zoom</translation>
+    </message>
+    <message>
+        <source>Drag a dial sideways. Pan and tilt spring back, zoom stays.</source>
+        <translation>Einen Knopf seitwärts ziehen. Schwenken und Neigen springen zurück, Zoom bleibt.</translation>
     </message>
 </context>
 <context>
@@ -1242,6 +1639,49 @@
     <message>
         <source>Arguments</source>
         <translation>Argumente</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::TimeLabelsPage</name>
+    <message>
+        <source>Time of the picture</source>
+        <translation>Zeit des Bildes</translation>
+    </message>
+    <message>
+        <source>Can be edited</source>
+        <translation>Kann geändert werden</translation>
+    </message>
+    <message>
+        <source>Comes from the file server</source>
+        <translation>Kommt vom Dateiserver</translation>
+    </message>
+    <message>
+        <source>Something is wrong</source>
+        <translation>Etwas stimmt nicht</translation>
+    </message>
+    <message>
+        <source>Count from here</source>
+        <translation>Von hier an zählen</translation>
+    </message>
+    <message>
+        <source>Drag the label by its symbol; a double click puts it back.</source>
+        <translation>Die Anzeige am Symbol ziehen; ein Doppelklick bringt sie zurück.</translation>
+    </message>
+    <message>
+        <source>Name, date and time in the room there is</source>
+        <translation>Name, Datum und Zeit im Platz, den es gibt</translation>
+    </message>
+    <message>
+        <source>The clock of the device is two minutes late</source>
+        <translation>Die Uhr des Geräts geht zwei Minuten nach</translation>
+    </message>
+    <message>
+        <source>Loading bay west</source>
+        <translation>Laderampe West</translation>
+    </message>
+    <message>
+        <source>A click on the narrowest line turns it over.</source>
+        <translation>Ein Klick auf die schmalste Zeile wendet sie.</translation>
     </message>
 </context>
 <context>

@@ -346,6 +346,25 @@
     </message>
 </context>
 <context>
+    <name>gallery::CountingLinesPage</name>
+    <message>
+        <source>Main entrance</source>
+        <translation>Entrée principale</translation>
+    </message>
+    <message>
+        <source>Outside</source>
+        <translation>Dehors</translation>
+    </message>
+    <message>
+        <source>Inside</source>
+        <translation>Dedans</translation>
+    </message>
+    <message>
+        <source>Drag the ends of the line in the picture, or change the numbers.</source>
+        <translation>Tirer les bouts de la ligne dans l’image, ou changer les nombres.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::DeviceBrowserPage</name>
     <message>
         <source>North gate</source>
@@ -406,6 +425,101 @@
     <message>
         <source>%1 of %2 devices, %3 ms</source>
         <translation>%1 appareils sur %2, %3 ms</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::EditsPage</name>
+    <message>
+        <source>Search</source>
+        <translation>Recherche</translation>
+    </message>
+    <message>
+        <source>Find a camera</source>
+        <translation>Chercher une caméra</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Portail</translation>
+    </message>
+    <message>
+        <source>Yard</source>
+        <translation>Cour</translation>
+    </message>
+    <message>
+        <source>Hall</source>
+        <translation>Hall</translation>
+    </message>
+    <message>
+        <source>Ramp</source>
+        <translation>Rampe</translation>
+    </message>
+    <message>
+        <source>Stairs</source>
+        <translation>Escalier</translation>
+    </message>
+    <message>
+        <source>north</source>
+        <translation>nord</translation>
+    </message>
+    <message>
+        <source>east</source>
+        <translation>est</translation>
+    </message>
+    <message>
+        <source>south</source>
+        <translation>sud</translation>
+    </message>
+    <message>
+        <source>west</source>
+        <translation>ouest</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Exportation</translation>
+    </message>
+    <message>
+        <source>Read only</source>
+        <translation>Lecture seule</translation>
+    </message>
+    <message>
+        <source>Folder</source>
+        <translation>Dossier</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>De</translation>
+    </message>
+    <message>
+        <source>To</source>
+        <translation>À</translation>
+    </message>
+    <message>
+        <source>Drop a file on the folder: its folder is taken. The cross brings the end back.</source>
+        <translation>Déposer un fichier sur le dossier : son dossier est pris. La croix rétablit la fin.</translation>
+    </message>
+    <message>
+        <source>A form that scrolls</source>
+        <translation>Un formulaire qui défile</translation>
+    </message>
+    <message>
+        <source>The wheel over a combo box scrolls the form and changes nothing.</source>
+        <translation>La molette sur une liste fait défiler le formulaire et ne change rien.</translation>
+    </message>
+    <message>
+        <source>25 pictures a second</source>
+        <translation>25 images par seconde</translation>
+    </message>
+    <message>
+        <source>12 pictures a second</source>
+        <translation>12 images par seconde</translation>
+    </message>
+    <message>
+        <source>1 picture a second</source>
+        <translation>1 image par seconde</translation>
+    </message>
+    <message>
+        <source>Camera %1</source>
+        <translation>Caméra %1</translation>
     </message>
 </context>
 <context>
@@ -489,6 +603,41 @@
     <message>
         <source>shadow</source>
         <translation>ombre</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::FramesPage</name>
+    <message>
+        <source>The picture: %1 × %1 pixels, cut %2 pixels from each side</source>
+        <translation>L’image : %1 × %1 pixels, coupée à %2 pixels de chaque côté</translation>
+    </message>
+    <message>
+        <source>Stretch the centre</source>
+        <translation>Étirer le centre</translation>
+    </message>
+    <message>
+        <source>The border keeps its width.</source>
+        <translation>Le bord garde sa largeur.</translation>
+    </message>
+    <message>
+        <source>Tile the centre</source>
+        <translation>Répéter le centre</translation>
+    </message>
+    <message>
+        <source>Stretch the border</source>
+        <translation>Étirer le bord</translation>
+    </message>
+    <message>
+        <source>The centre keeps its size.</source>
+        <translation>Le centre garde sa taille.</translation>
+    </message>
+    <message>
+        <source>Tile the border</source>
+        <translation>Répéter le bord</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Opacité</translation>
     </message>
 </context>
 <context>
@@ -720,6 +869,57 @@
     </message>
 </context>
 <context>
+    <name>gallery::OverlaysPage</name>
+    <message>
+        <source>Connection</source>
+        <translation>Connexion</translation>
+    </message>
+    <message>
+        <source>Cut the line</source>
+        <translation>Couper la ligne</translation>
+    </message>
+    <message>
+        <source>Count the seconds</source>
+        <translation>Compter les secondes</translation>
+    </message>
+    <message>
+        <source>Another text, %1 is the time</source>
+        <translation>Autre texte, %1 est la durée</translation>
+    </message>
+    <message>
+        <source>The spinner comes a second later: a short loss shows nothing.</source>
+        <translation>Le signe tournant vient une seconde plus tard : une courte perte ne montre rien.</translation>
+    </message>
+    <message>
+        <source>Signs</source>
+        <translation>Signes</translation>
+    </message>
+    <message>
+        <source>Play</source>
+        <translation>Lecture</translation>
+    </message>
+    <message>
+        <source>Pause</source>
+        <translation>Pause</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Texte</translation>
+    </message>
+    <message>
+        <source>Start of the recording</source>
+        <translation>Début de l’enregistrement</translation>
+    </message>
+    <message>
+        <source>Icon and text</source>
+        <translation>Icône et texte</translation>
+    </message>
+    <message>
+        <source>Picture saved</source>
+        <translation>Image enregistrée</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PageList</name>
     <message>
         <source>Cameras</source>
@@ -869,6 +1069,50 @@
         <source>FadeView is a strip at the edge of a view that slides open and can take the full height; FadeStripeView adds a handle, a time line and rows of contents.</source>
         <translation>FadeView est une bande au bord d&apos;une vue qui s&apos;ouvre en glissant et peut prendre toute la hauteur ; FadeStripeView ajoute une poignée, une ligne de temps et des rangées.</translation>
     </message>
+    <message>
+        <source>Overlays</source>
+        <translation>Incrustations</translation>
+    </message>
+    <message>
+        <source>BusyOverlayView tells that a connection has gone and for how long; IconOverlayView shows a sign for a moment and deletes itself.</source>
+        <translation>BusyOverlayView signale qu’une connexion est perdue et depuis combien de temps ; IconOverlayView montre un signe un instant et se supprime.</translation>
+    </message>
+    <message>
+        <source>Time labels</source>
+        <translation>Étiquettes d’heure</translation>
+    </message>
+    <message>
+        <source>TimeLabel shows the time of a picture and lets it be edited; NameTimeLabel drops what has no room.</source>
+        <translation>TimeLabel montre l’heure d’une image et permet de la modifier ; NameTimeLabel omet ce qui n’a pas de place.</translation>
+    </message>
+    <message>
+        <source>Frames</source>
+        <translation>Cadres</translation>
+    </message>
+    <message>
+        <source>BorderIcon cuts a small picture into nine parts and fills any rectangle with it.</source>
+        <translation>BorderIcon découpe une petite image en neuf parties et en remplit n’importe quel rectangle.</translation>
+    </message>
+    <message>
+        <source>Controls</source>
+        <translation>Commandes</translation>
+    </message>
+    <message>
+        <source>Edits</source>
+        <translation>Champs de saisie</translation>
+    </message>
+    <message>
+        <source>Fields for search words, folders and times, and a combo box that leaves the wheel to the form around it.</source>
+        <translation>Des champs pour recherches, dossiers et heures, et une liste déroulante qui laisse la molette au formulaire.</translation>
+    </message>
+    <message>
+        <source>Counting lines</source>
+        <translation>Lignes de comptage</translation>
+    </message>
+    <message>
+        <source>VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is counted.</source>
+        <translation>VxCountingLinesGroupBox modifie une ligne dans l’image ; qui la franchit est compté.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>
@@ -1001,6 +1245,120 @@
     </message>
 </context>
 <context>
+    <name>gallery::PasswordPage</name>
+    <message>
+        <source>New password</source>
+        <translation>Nouveau mot de passe</translation>
+    </message>
+    <message>
+        <source>Once more</source>
+        <translation>Encore une fois</translation>
+    </message>
+    <message>
+        <source>Password of the camera</source>
+        <translation>Mot de passe de la caméra</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Start again</source>
+        <translation>Recommencer</translation>
+    </message>
+    <message>
+        <source>What is asked of it</source>
+        <translation>Ce qui est exigé</translation>
+    </message>
+    <message>
+        <source>%1 characters or more</source>
+        <translation>%1 caractères ou plus</translation>
+    </message>
+    <message>
+        <source>A small and a capital letter</source>
+        <translation>Une minuscule et une majuscule</translation>
+    </message>
+    <message>
+        <source>A digit and a letter</source>
+        <translation>Un chiffre et une lettre</translation>
+    </message>
+    <message>
+        <source>A special character</source>
+        <translation>Un caractère spécial</translation>
+    </message>
+    <message>
+        <source>Not used before (Camera_2025 was)</source>
+        <translation>Pas déjà utilisé (Camera_2025 l’a été)</translation>
+    </message>
+    <message>
+        <source>The same both times</source>
+        <translation>Identique les deux fois</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PhoneListPage</name>
+    <message>
+        <source>Gate west</source>
+        <translation>Portail ouest</translation>
+    </message>
+    <message>
+        <source>Yard north</source>
+        <translation>Cour nord</translation>
+    </message>
+    <message>
+        <source>Entrance hall</source>
+        <translation>Hall d’entrée</translation>
+    </message>
+    <message>
+        <source>Ramp</source>
+        <translation>Rampe</translation>
+    </message>
+    <message>
+        <source>Stairs</source>
+        <translation>Escalier</translation>
+    </message>
+    <message>
+        <source>Roof</source>
+        <translation>Toit</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>hors ligne</translation>
+    </message>
+    <message>
+        <source>online</source>
+        <translation>en ligne</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminé</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Modifier</translation>
+    </message>
+    <message>
+        <source>Add a camera</source>
+        <translation>Ajouter une caméra</translation>
+    </message>
+    <message>
+        <source>Camera %1</source>
+        <translation>Caméra %1</translation>
+    </message>
+    <message>
+        <source>Keep the last one</source>
+        <translation>Garder la dernière</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>Appareils</translation>
+    </message>
+    <message>
+        <source>While you edit: the red sign brings out a button that deletes the row, a row is dragged to another place, and its name can be changed.</source>
+        <translation>Pendant la modification : le signe rouge fait apparaître un bouton qui supprime la ligne, une ligne se tire à une autre place, et son nom peut être changé.</translation>
+    </message>
+</context>
+<context>
     <name>gallery::PopoversPage</name>
     <message>
         <source>Camera %1</source>
@@ -1117,6 +1475,45 @@
     <message>
         <source>Dropped: %1</source>
         <translation>Déposé : %1</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PtzPage</name>
+    <message>
+        <source>to the left</source>
+        <translation>à gauche</translation>
+    </message>
+    <message>
+        <source>to the right</source>
+        <translation>à droite</translation>
+    </message>
+    <message>
+        <source>down</source>
+        <translation>vers le bas</translation>
+    </message>
+    <message>
+        <source>up</source>
+        <translation>vers le haut</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Caméra</translation>
+    </message>
+    <message>
+        <source>Pan</source>
+        <translation>Panoramique</translation>
+    </message>
+    <message>
+        <source>Tilt</source>
+        <translation>Inclinaison</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <translation>Zoom</translation>
+    </message>
+    <message>
+        <source>Drag a dial sideways. Pan and tilt spring back, zoom stays.</source>
+        <translation>Tirer une molette latéralement. Panoramique et inclinaison reviennent, le zoom reste.</translation>
     </message>
 </context>
 <context>
@@ -1242,6 +1639,49 @@
     <message>
         <source>Arguments</source>
         <translation>Arguments</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::TimeLabelsPage</name>
+    <message>
+        <source>Time of the picture</source>
+        <translation>Heure de l’image</translation>
+    </message>
+    <message>
+        <source>Can be edited</source>
+        <translation>Modifiable</translation>
+    </message>
+    <message>
+        <source>Comes from the file server</source>
+        <translation>Vient du serveur de fichiers</translation>
+    </message>
+    <message>
+        <source>Something is wrong</source>
+        <translation>Quelque chose ne va pas</translation>
+    </message>
+    <message>
+        <source>Count from here</source>
+        <translation>Compter à partir d’ici</translation>
+    </message>
+    <message>
+        <source>Drag the label by its symbol; a double click puts it back.</source>
+        <translation>Tirer l’étiquette par son symbole ; un double clic la remet en place.</translation>
+    </message>
+    <message>
+        <source>Name, date and time in the room there is</source>
+        <translation>Nom, date et heure dans la place disponible</translation>
+    </message>
+    <message>
+        <source>The clock of the device is two minutes late</source>
+        <translation>L’horloge de l’appareil retarde de deux minutes</translation>
+    </message>
+    <message>
+        <source>Loading bay west</source>
+        <translation>Quai ouest</translation>
+    </message>
+    <message>
+        <source>A click on the narrowest line turns it over.</source>
+        <translation>Un clic sur la ligne la plus étroite la retourne.</translation>
     </message>
 </context>
 <context>

@@ -36,7 +36,9 @@ const Color s_colors[] = {
     {"accenttext", "#ffffff", "#0d1524"}, {"hover", "#e6eaf1", "#2a3341"},
     {"pressed", "#d9dfe9", "#354051"},    {"selection", "#dce8fc", "#23395c"},
     {"selected", "#123f8c", "#cfe1ff"},   {"tip", "#232b37", "#e7ebf2"},
-    {"tiptext", "#f3f5f8", "#18202c"},
+    {"tiptext", "#f3f5f8", "#18202c"},    {"bad", "#c8373c", "#ff7b7b"},
+    {"badground", "#fdf0f0", "#3a2228"},  {"good", "#1f8a50", "#57c98a"},
+    {"goodground", "#eefaf3", "#1c3329"},
 };
 
 QColor color(Name name, const char* word)

@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Draws the pictures of popovers, time line and switch anew, in pictures/: run it after a change, commit the result."""
+"""Draws the pictures of popovers, time line, switch and overlays anew, in pictures/: run it after a change, commit."""
 import math
 import os
 import sys
@@ -76,8 +76,38 @@ def popovers():
                       render(size, size, [(shape(size), plain(*colour))]))
 
 
+def disc(*glyph):
+    """A sign for a moment: a white glyph on a dark disc."""
+    return render(96, 96, [(circle(48, 48, 46), plain(12, 16, 22, 170))] + [(part, plain(255, 255, 255)) for part in glyph])
+
+
+def overlays():
+    folder = os.path.join(HERE, "pictures", "overlays")
+    signs = {"play": [polygon((38, 28), (70, 48), (38, 68))],
+             "pause": [box(33, 29, 43, 67, 2), box(53, 29, 63, 67, 2)],
+             "snapshot": [box(24, 36, 72, 68, 6), box(38, 29, 58, 40, 4)]}
+    for name, glyph in signs.items():
+        layers = disc(*glyph) if name != "snapshot" else render(96, 96, [
+            (circle(48, 48, 46), plain(12, 16, 22, 170)), (glyph[0], plain(255, 255, 255)),
+            (glyph[1], plain(255, 255, 255)), (circle(48, 52, 12), plain(12, 16, 22)),
+            (circle(48, 52, 7), plain(255, 255, 255))])
+        write(os.path.join(folder, "sign-%s.png" % name), RGBA, layers)
+    white = plain(255, 255, 255)
+    # 94 wide and 108 high, as the time label has its symbol.
+    write(os.path.join(folder, "from-camera.png"), RGBA, render(94, 108, [
+        (box(12, 34, 60, 76, 8), white), (polygon((62, 55), (82, 38), (82, 72)), white),
+        (circle(26, 55, 7), plain(214, 62, 62))]))
+    write(os.path.join(folder, "from-server.png"), RGBA, render(94, 108, [
+        (box(16, 30 + 18 * row, 78, 44 + 18 * row, 4), white) for row in range(3)] + [
+        (circle(68, 37 + 18 * row, 3.5), plain(40, 160, 90)) for row in range(3)]))
+    write(os.path.join(folder, "from-nowhere.png"), RGBA, render(94, 108, [
+        (polygon((47, 24), (84, 86), (10, 86)), plain(255, 190, 60)), (box(43.5, 46, 50.5, 68, 3), plain(40, 30, 0)),
+        (circle(47, 76, 4), plain(40, 30, 0))]))
+
+
 def main():
     popovers()
+    overlays()
     write(os.path.join(HERE, "pictures", "switch", "btn_schalter.png"), RGBA, switch())
     folder = os.path.join(HERE, "pictures", "time-line")
     write(os.path.join(folder, "glow.png"), RGBA, glow())
