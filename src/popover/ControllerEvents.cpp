@@ -22,9 +22,9 @@ namespace PopoverWidget
 {
 void Controller::mousePressEvent(QMouseEvent* event)
 {
-    if (m_balloon != nullptr
-        && isPressOutside(m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible)) {
-        m_pressedOutside = true;
+    if (m_balloon != nullptr) {
+        // A press inside ends what a press outside has begun: its release may have gone to a nested popover.
+        m_pressedOutside = isPressOutside(m_balloon->geometry().contains(event->pos()), m_closing, m_stayVisible);
     }
     FadableThing<QWidget>::mousePressEvent(event);
 }

@@ -620,15 +620,18 @@ private Q_SLOTS:
 
     void closingWithoutAnimationEndsARunningFadeIn()
     {
-        PopoverScene scene;
-        TestController* const controller = scene.build();
-        controller->setPersistence(true);
-        controller->setActive(true, showFlags(Controller::epsBalloon), true);
-        SignalRecorder recorder(controller);
-        controller->dismiss(false, false);
-        QVERIFY(!QTest::qWaitFor([&] { return recorder.count(QStringLiteral("popoverDidAppear")) != 0; }, 150));
-        QCOMPARE(recorder.count(QStringLiteral("popoverDidDisappear")), 1);
-        QVERIFY(controller->isHidden());
+        for (const int flags : {1, 2}) {
+            PopoverScene scene;
+            TestController* const controller = scene.build();
+            controller->setPersistence(true);
+            controller->setActive(true, showFlags(flags), true);
+            SignalRecorder recorder(controller);
+            controller->dismiss(false, false);
+            QVERIFY(
+                !QTest::qWaitFor([&] { return recorder.count(QStringLiteral("popoverDidAppear")) != 0; }, 150));
+            QCOMPARE(recorder.count(QStringLiteral("popoverDidDisappear")), 1);
+            QVERIFY(controller->isHidden());
+        }
     }
 
     void openingAtOnceAfterShrinkingShowsTheContent()

@@ -102,6 +102,23 @@ private Q_SLOTS:
         QVERIFY(controller->isActive());
     }
 
+    void aClickBesideANestedPopoverIsNoBusinessOfTheOuterOne()
+    {
+        PopoverScene scene;
+        TestController* const outer = scene.build();
+        outer->setActive();
+        TestController* const inner = new TestController(outer, scene.row);
+        inner->setContainer(new zelkovtest::TestContainer, QFlags<Balloon::EBalloonFeature>(QFlag(8)));
+        inner->setActive();
+        PopoverScene::click(inner, c_outside);
+        QVERIFY(!inner->isActive());
+        QVERIFY(outer->isActive());
+        // The press reached the outer one, too, and must not make a click of the next release.
+        PopoverScene::press(outer, c_inside);
+        PopoverScene::release(outer, c_outside);
+        QVERIFY(outer->isActive());
+    }
+
     void aPopoverThatStaysTakesNoClick()
     {
         PopoverScene scene;
@@ -262,6 +279,16 @@ private Q_SLOTS:
         QCOMPARE(inner->geometry(), QRect(0, 0, 400, 300));
         scene.window->resize(500, 350);
         QCOMPARE(inner->geometry(), QRect(0, 0, 500, 350));
+        // Also without a resize of what they cover: each descendant is handed the event once.
+        TestController* const innermost = new TestController(inner, nullptr);
+        innermost->setContainer(new zelkovtest::TestContainer, QFlags<Balloon::EBalloonFeature>(QFlag(8)));
+        innermost->setActive();
+        SignalRecorder innerRecorder(inner);
+        SignalRecorder innermostRecorder(innermost);
+        QResizeEvent event(QSize(500, 350), QSize(400, 300));
+        static_cast<QObject*>(inner)->event(&event);
+        QCOMPARE(innerRecorder.count(QStringLiteral("layoutUpdated")), 1);
+        QCOMPARE(innermostRecorder.count(QStringLiteral("layoutUpdated")), 1);
     }
 
     void theBalloonFollowsItsTarget()
