@@ -284,8 +284,10 @@ QMouseEvent* DialButton::createMouseEvent(QMouseEvent* event, const QPoint& refe
     const int wanted = m_horizontalNow
         ? dialValueAfterDrag(value, event->x() - reference.x(), width(), dialRangeOf(*this))
         : 0; // the literal 0, whatever the value: clients rely on it
-    auto* const made = new QMouseEvent(
-        event->type(), pointFromValue(wanted), event->button(), event->buttons(), event->modifiers());
+    // QDial measures from the exact middle, which lies beside rect().center(): that alone is worth a step.
+    const QPointF spot = pointFromValue(wanted) - rect().center() + QPointF(width() / 2.0, height() / 2.0);
+    auto* const made
+        = new QMouseEvent(event->type(), spot, event->button(), event->buttons(), event->modifiers());
     made->setAccepted(event->isAccepted());
     return made;
 }

@@ -5,7 +5,7 @@
 
 namespace vx
 {
-int listDropRow(int sourceRow, int rowAtDrop, QAbstractItemView::DropIndicatorPosition indicator, int count)
+int listDropRow(int sourceRow, int rowAtDrop, ListDropSide side, int count)
 {
     int offset = 0;
     if (side == ListDropSide::Above) {

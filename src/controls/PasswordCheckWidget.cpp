@@ -4,6 +4,7 @@
 #include "CoreQt/Connect.h"
 #include "controls/PasswordRules.h"
 
+#include <QtCore/QPointer>
 #include <QtGui/QPainter>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QBoxLayout>
@@ -34,7 +35,17 @@ PasswordCheckWidget::PasswordCheckWidget(
     init(new QLabel(tr("Password")), new QLabel(tr("Confirm Password")), Horizontal, oldPasswordSet, requirements);
 }
 
-PasswordCheckWidget::~PasswordCheckWidget() = default;
+PasswordCheckWidget::~PasswordCheckWidget()
+{
+    if (m_rescued) {
+        for (QLineEdit* const edit : {m_firstLineEdit, m_secondLineEdit}) {
+            edit->disconnect(this);
+            edit->hide();
+            edit->setParent(nullptr);
+            m_rescued->append(edit);
+        }
+    }
+}
 
 void PasswordCheckWidget::init(QWidget* firstLabel, QWidget* secondLabel, Orientation orientation,
     bool oldPasswordSet, QFlags<ESecurityRequirement> requirements)
@@ -251,18 +262,37 @@ PasswordCheckWidget::EPasswordsMatchState PasswordCheckWidget::passwordsMatchDis
     return m_passwordsMatch;
 }
 
+// The field is in the middle of a key event and goes on with it after this: it has to outlive a form that is deleted
+// by a slot.
+void PasswordCheckWidget::reportEdit(const QString& text)
+{
+    QVector<QLineEdit*> rescued;
+    QVector<QLineEdit*>* const outer = m_rescued;
+    const QPointer<PasswordCheckWidget> alive(this);
+    if (!outer) {
+        m_rescued = &rescued;
+    }
+    Q_EMIT passwordChanged(text, allRequirementsMet());
+    if (alive) {
+        m_rescued = outer;
+    }
+    for (QLineEdit* const edit : qAsConst(rescued)) {
+        edit->deleteLater();
+    }
+}
+
 void PasswordCheckWidget::onTextChangedFirst(QString text)
 {
     setDirtyFirst(true);
     updateSecurityState();
-    Q_EMIT passwordChanged(text, allRequirementsMet());
+    reportEdit(text);
 }
 
 void PasswordCheckWidget::onTextChangedSecond(QString text)
 {
     setDirtySecond(true);
     updateSecurityState();
-    Q_EMIT passwordChanged(text, allRequirementsMet());
+    reportEdit(text);
 }
 
 void PasswordCheckWidget::paintEvent(QPaintEvent* event)

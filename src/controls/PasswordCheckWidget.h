@@ -6,6 +6,7 @@
 
 #include <QtCore/QFlags>
 #include <QtCore/QString>
+#include <QtCore/QVector>
 #include <QtWidgets/QWidget>
 
 class QBoxLayout;
@@ -132,6 +133,8 @@ private Q_SLOTS:
     void onTextChangedSecond(QString text);
 
 private:
+    void reportEdit(const QString& text);
+
     QFlags<ESecurityRequirement> m_securityRequirements;
     int m_minimumLength;
     ESecureState m_secureState = essNone;
@@ -142,6 +145,7 @@ private:
     QLineEdit* m_firstLineEdit = nullptr;
     QLineEdit* m_secondLineEdit = nullptr;
     QString m_allowedCharacters;
+    QVector<QLineEdit*>* m_rescued = nullptr; // where the destructor leaves fields that are in their own signal
 };
 }
 

@@ -232,6 +232,14 @@ void iOSListWidget::dragPayload(iOSListWidgetItem* item, Qt::DropActions support
     drag->exec(supportedActions);
 }
 
+void iOSListWidget::wheelEvent(QWheelEvent* event)
+{
+    constexpr int step = 8; // pixels
+    horizontalScrollBar()->setSingleStep(step);
+    verticalScrollBar()->setSingleStep(step);
+    QListWidget::wheelEvent(event);
+}
+
 void iOSListWidget::dropEvent(QDropEvent* event)
 {
     if (event->source() != this || (event->dropAction() != Qt::MoveAction && dragDropMode() != InternalMove)) {
@@ -263,7 +271,9 @@ void iOSListWidget::dropKeepingTheRows(QDropEvent* event)
         const iOSListWidgetItem* const item = getIOSItem(row);
         containers.append(item ? item->m_container : nullptr);
     }
+    event->ignore(); // the view moves rows for events that nobody has accepted; others it copies
     QListWidget::dropEvent(event);
+    event->accept();
     for (const QPointer<QWidget>& container : containers) {
         if (container) {
             QCoreApplication::removePostedEvents(container, QEvent::DeferredDelete);

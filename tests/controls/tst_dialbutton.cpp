@@ -13,6 +13,7 @@
 #include <QtGui/QImage>
 #include <QtGui/QPainter>
 #include <QtTest/QtTest>
+#include <QtWidgets/QStyle>
 
 #include <cmath>
 #include <limits>
@@ -499,7 +500,7 @@ private Q_SLOTS:
 
     void theValueIsTraced()
     {
-        zelkovtest::LogCapture log(vx::c_LogTrace);
+        zelkovtest::LogCapture log(1);
         vx::DialButton dial;
         dial.setValue(5);
         QVERIFY2(log.lines().join(QLatin1Char('\n')).contains(

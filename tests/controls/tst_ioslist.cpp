@@ -32,13 +32,19 @@ struct Phone
     {
         window.resize(320, 400);
         list = new List(&window, QStringLiteral("devices"));
-        list->setGeometry(0, 0, 300, 380);
+        auto* const column = new QVBoxLayout(&window);
+        column->addWidget(list);
+        column->addStretch();
     }
     Row* add(const char* text, QWidget* edit = nullptr, QWidget* selected = nullptr, QWidget* accessory = nullptr)
     {
         return new Row(list, new QLabel(QLatin1String(text)), QStringLiteral("row"), QSize(), edit, selected, accessory);
     }
-    void show() { window.show(); }
+    void show()
+    {
+        window.show();
+        QCoreApplication::processEvents(); // what the rows asked of the layout
+    }
 
     static QWidget* container(Row* row) { return row->listWidget()->itemWidget(row); }
     static vx::iOSListWidgetDeleteIcon* icon(Row* row)
@@ -109,7 +115,7 @@ private Q_SLOTS:
         QCOMPARE(list.minimumHeight(), 0);
         QCOMPARE(list.maximumHeight(), 0);
         QCOMPARE(list.sizePolicy(), QSizePolicy(QSizePolicy::Expanding, QSizePolicy::Preferred));
-        QCOMPARE(list.dragDropMode(), QAbstractItemView::DragOnly);
+        QCOMPARE(list.dragDropMode(), QAbstractItemView::DragDrop); // drags only by the mode, but drops are accepted
         QCOMPARE(list.defaultDropAction(), Qt::MoveAction);
         QVERIFY(list.acceptDrops());
         QVERIFY(list.viewport()->acceptDrops());
@@ -381,6 +387,9 @@ private Q_SLOTS:
     {
         Phone phone;
         Row* const row = phone.add("1");
+        phone.list->setEditMode(true);
+        row->setDeleteMode(true, false);
+        phone.show();
         QTest::mouseClick(Phone::button(row), Qt::LeftButton);
         phone.list->clear();
         phone.add("2");

@@ -89,6 +89,7 @@ std::vector<Entry> modelsEntries();
 std::vector<Entry> viewsEntries();
 std::vector<Entry> editsEntries();
 std::vector<Entry> overlayEntries();
+std::vector<Entry> controlsEntries();
 std::vector<Entry> switchEntries();
 std::vector<Entry> controllerEntries();
 
