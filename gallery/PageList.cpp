@@ -15,12 +15,15 @@
 #include "pages/LabelsPage.h"
 #include "pages/MouseGesturesPage.h"
 #include "pages/OverlaysPage.h"
+#include "pages/PasswordPage.h"
+#include "pages/PhoneListPage.h"
 #include "pages/PopoversPage.h"
 #include "pages/PanelsPage.h"
 #include "pages/PagesPage.h"
 #include "pages/ZoomAreaPage.h"
 #include "pages/RubberBandPage.h"
 #include "pages/ToolBarPage.h"
+#include "pages/PtzPage.h"
 #include "pages/ScrollBarsPage.h"
 #include "pages/TimeLabelsPage.h"
 #include "pages/TimeLinePage.h"
@@ -154,6 +157,23 @@ const QVector<PageEntry>& pages()
                            "VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is "
                            "counted."),
          &make<CountingLinesPage>},
+        {"password-form", QT_TRANSLATE_NOOP("gallery::PageList", "Controls"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Password form"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "PasswordCheckWidget checks a new password while it is typed; the theme colours the "
+                           "fields by its verdict."),
+         &make<PasswordPage>},
+        {"dial-and-joystick", QT_TRANSLATE_NOOP("gallery::PageList", "Controls"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Dial and joystick"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "DialButton is dragged sideways and can spring back; JoystickViewWidget shows where a "
+                           "stick stands."),
+         &make<PtzPage>},
+        {"phone-list", QT_TRANSLATE_NOOP("gallery::PageList", "Controls"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Phone-style list"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "iOSListWidget has rows that can be edited, deleted and put in another order."),
+         &make<PhoneListPage>},
         {"device-browser", QT_TRANSLATE_NOOP("gallery::PageList", "Models"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Device browser"),
          QT_TRANSLATE_NOOP("gallery::PageList",

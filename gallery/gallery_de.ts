@@ -1113,6 +1113,30 @@
         <source>VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is counted.</source>
         <translation>VxCountingLinesGroupBox bearbeitet eine Linie im Bild; wer sie überquert, wird gezählt.</translation>
     </message>
+    <message>
+        <source>Password form</source>
+        <translation>Passwortformular</translation>
+    </message>
+    <message>
+        <source>PasswordCheckWidget checks a new password while it is typed; the theme colours the fields by its verdict.</source>
+        <translation>PasswordCheckWidget prüft ein neues Passwort beim Tippen; das Thema färbt die Felder nach seinem Urteil.</translation>
+    </message>
+    <message>
+        <source>Dial and joystick</source>
+        <translation>Drehknopf und Joystick</translation>
+    </message>
+    <message>
+        <source>DialButton is dragged sideways and can spring back; JoystickViewWidget shows where a stick stands.</source>
+        <translation>DialButton wird seitwärts gezogen und kann zurückspringen; JoystickViewWidget zeigt, wo ein Knüppel steht.</translation>
+    </message>
+    <message>
+        <source>Phone-style list</source>
+        <translation>Liste wie am Telefon</translation>
+    </message>
+    <message>
+        <source>iOSListWidget has rows that can be edited, deleted and put in another order.</source>
+        <translation>iOSListWidget hat Zeilen, die sich bearbeiten, löschen und umordnen lassen.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>

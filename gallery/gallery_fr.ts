@@ -1113,6 +1113,30 @@
         <source>VxCountingLinesGroupBox edits a line across the picture; whoever crosses it is counted.</source>
         <translation>VxCountingLinesGroupBox modifie une ligne dans l’image ; qui la franchit est compté.</translation>
     </message>
+    <message>
+        <source>Password form</source>
+        <translation>Formulaire de mot de passe</translation>
+    </message>
+    <message>
+        <source>PasswordCheckWidget checks a new password while it is typed; the theme colours the fields by its verdict.</source>
+        <translation>PasswordCheckWidget vérifie un nouveau mot de passe pendant la saisie ; le thème colore les champs selon son verdict.</translation>
+    </message>
+    <message>
+        <source>Dial and joystick</source>
+        <translation>Molette et manette</translation>
+    </message>
+    <message>
+        <source>DialButton is dragged sideways and can spring back; JoystickViewWidget shows where a stick stands.</source>
+        <translation>DialButton se tire latéralement et peut revenir à sa place ; JoystickViewWidget montre la position d’une manette.</translation>
+    </message>
+    <message>
+        <source>Phone-style list</source>
+        <translation>Liste façon téléphone</translation>
+    </message>
+    <message>
+        <source>iOSListWidget has rows that can be edited, deleted and put in another order.</source>
+        <translation>iOSListWidget a des lignes que l’on peut modifier, supprimer et réordonner.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>

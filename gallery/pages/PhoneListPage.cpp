@@ -19,6 +19,8 @@ namespace gallery
 PhoneListPage::PhoneListPage(SignalLog& log, QWidget* parent)
     : Page(log, parent), m_list(new vx::iOSListWidget(nullptr, QStringLiteral("devices"))), m_edit(new QPushButton)
 {
+    // It is as high as its rows, which leaves no room for a frame.
+    m_list->setFrameShape(QFrame::NoFrame);
     watch(m_list, QStringLiteral("list"));
     announcePlace(m_list, QStringLiteral("list"));
     const QStringList names{tr("Gate west"), tr("Yard north"), tr("Entrance hall"), tr("Ramp"), tr("Stairs"), tr("Roof")};
@@ -41,6 +43,7 @@ PhoneListPage::PhoneListPage(SignalLog& log, QWidget* parent)
 
     QWidget* box = panel();
     box->setFixedWidth(440);
+    box->setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Maximum);
     auto* column = new QVBoxLayout(box);
     column->setContentsMargins(16, 12, 16, 16);
     column->setSpacing(10);
@@ -55,7 +58,6 @@ PhoneListPage::PhoneListPage(SignalLog& log, QWidget* parent)
     bottom->addStretch(1);
     bottom->addWidget(add);
     column->addLayout(bottom);
-    column->addStretch(0);
 
     auto* hint = label(tr("While you edit: the red sign brings out a button that deletes the row, a row is dragged to "
                           "another place, and its name can be changed."),
@@ -65,7 +67,7 @@ PhoneListPage::PhoneListPage(SignalLog& log, QWidget* parent)
     auto* layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(16);
-    layout->addWidget(box);
+    layout->addWidget(box, 0, Qt::AlignTop);
     layout->addWidget(hint, 0, Qt::AlignTop);
     layout->addStretch(1);
 }
@@ -73,11 +75,11 @@ PhoneListPage::PhoneListPage(SignalLog& log, QWidget* parent)
 void PhoneListPage::addDevice(const QString& name, const QString& state)
 {
     auto* shown = new QLabel(name);
-    shown->setMargin(8);
+    shown->setMargin(10);
     auto* field = new QLineEdit(name);
     connect(field, &QLineEdit::textChanged, shown, &QLabel::setText);
     auto* word = label(state, "hint");
-    word->setMargin(8);
+    word->setMargin(10);
     // The row puts itself at the end of the list, which owns it.
     auto* row = new vx::iOSListWidgetItem(m_list, shown, QStringLiteral("device"), QSize(), field, nullptr, word);
     row->setData(Qt::UserRole, name);

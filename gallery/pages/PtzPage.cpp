@@ -22,7 +22,8 @@ namespace gallery
 namespace
 {
 constexpr int s_dial = 112;
-constexpr int s_stick = 200;
+constexpr int s_stick = 190;
+constexpr int s_balloon = 26;
 
 // Pictures of a dial and a stick in the colours of the palette; an application has files and names them in its
 // style sheet: qproperty-button: url(...).
@@ -114,6 +115,7 @@ vx::DialButton* PtzPage::makeDial(const QString& name, int minimum, int maximum,
     dial->setRightPadding(14);
     dial->setTopPadding(14);
     dial->setBottomPadding(14);
+    dial->setBalloonFeatures(vx::PopoverWidget::Balloon::ebfNoHeader);
     watch(dial, name);
     announcePlace(dial, name);
     return dial;
@@ -143,7 +145,8 @@ QWidget* PtzPage::makePanel()
     grid->setHorizontalSpacing(24);
     grid->setVerticalSpacing(8);
     grid->addWidget(label(tr("Camera"), "heading"), 0, 0, 1, 2);
-    grid->addWidget(m_stick, 1, 0, 1, 2, Qt::AlignHCenter);
+    grid->addWidget(m_stick, 1, 0, 1, 2, Qt::AlignHCenter | Qt::AlignTop);
+    grid->setRowMinimumHeight(1, s_stick + s_balloon);
     grid->addWidget(m_pan, 2, 0, Qt::AlignHCenter);
     grid->addWidget(m_tilt, 2, 1, Qt::AlignHCenter);
     grid->addWidget(label(tr("Pan"), "hint"), 3, 0, Qt::AlignHCenter);
