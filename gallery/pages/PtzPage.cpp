@@ -21,8 +21,8 @@ namespace gallery
 {
 namespace
 {
-constexpr int s_dial = 112;
-constexpr int s_stick = 190;
+constexpr int s_dial = 108;
+constexpr int s_stick = 164;
 constexpr int s_balloon = 26;
 
 // Pictures of a dial and a stick in the colours of the palette; an application has files and names them in its
