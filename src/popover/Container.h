@@ -8,6 +8,7 @@
 #include <QtCore/QList>
 #include <QtCore/QPointer>
 #include <QtCore/QString>
+#include <QtCore/QStringList>
 #include <QtCore/QVariant>
 #include <QtWidgets/QSizePolicy>
 #include <QtWidgets/QWidget>
@@ -161,7 +162,10 @@ public:
     void setContainerVisibility(Container* container, bool visible, bool emitSignal);
     bool getContainerVisibility(Container* container) const;
 
-    // The radio list of a submenu comes next.
+    /// Fills the container of a submenu with one radio row for each text, all with the id \a itemId and one group, and
+    /// chooses the one at \a selected. Whatever else was in there is deleted. Ignored for items that are no submenu.
+    void setSubmenuRadioList(
+        int submenuId, int itemId, const QStringList& texts, int selected, const QString& objectName);
 
     /// The item that gets the focus when the popover opens; -1, the default, for none.
     void setAutoFocusItem(int id);

@@ -4,6 +4,11 @@
 
 #include "popover/Container.h"
 #include "popover/WidgetItem.h"
+#include "popover/items/RadioItem.h"
+#include "popover/items/SliderItem.h"
+#include "popover/items/Submenu.h"
+
+#include <QtWidgets/QButtonGroup>
 
 namespace vx
 {
@@ -11,13 +16,8 @@ namespace PopoverWidget
 {
 namespace
 {
-bool isSliderItem(const Item* item)
-{
-    return item->inherits("vx::PopoverWidget::SliderItem");
-}
-
 /// Handles are cared for in the footer first, then in the header, then in the direct items.
-QList<QPointer<Item>> sliderItems(const Container* header, const Container* footer, const QList<Item*>& direct)
+QList<QPointer<SliderItem>> sliderItems(const Container* header, const Container* footer, const QList<Item*>& direct)
 {
     QList<Item*> all;
     if (footer) {
@@ -27,19 +27,43 @@ QList<QPointer<Item>> sliderItems(const Container* header, const Container* foot
         all += header->getItems();
     }
     all += direct;
-    QList<QPointer<Item>> result;
+    QList<QPointer<SliderItem>> result;
     for (Item* const item : all) {
-        if (isSliderItem(item)) {
-            result.append(item);
+        if (auto* const sliderItem = qobject_cast<SliderItem*>(item)) {
+            result.append(sliderItem);
         }
     }
     return result;
 }
 }
 
-Container* ContainerLinks::containerOf(Item* /*item*/)
+Container* ContainerLinks::containerOf(Item* item)
 {
-    return nullptr;
+    const auto* const submenu = qobject_cast<Submenu*>(item);
+    return submenu ? submenu->container() : nullptr;
+}
+
+void Container::setSubmenuRadioList(
+    int submenuId, int itemId, const QStringList& texts, int selected, const QString& objectName)
+{
+    auto* const submenu = submenuId == -1 ? nullptr : qobject_cast<Submenu*>(getItem(submenuId));
+    const QPointer<Container> list = submenu ? submenu->container() : nullptr;
+    if (!list) {
+        return;
+    }
+    const QPointer<Container> self(this);
+    list->resetLayout(true, false);
+    if (!self || !list) {
+        return;
+    }
+    auto* const group = new QButtonGroup(this);
+    for (int index = 0; index < texts.size() && list; ++index) {
+        list->addItem(new RadioItem(
+            texts.at(index), objectName, itemId, index == selected, group, eifControl | eifText, nullptr));
+    }
+    if (self) {
+        emitLayoutChanged();
+    }
 }
 
 void Container::setItemValue(int id, const QVariant& value, bool emitSignal)
@@ -49,7 +73,7 @@ void Container::setItemValue(int id, const QVariant& value, bool emitSignal)
         return;
     }
     const QPointer<Container> self(this);
-    if (isSliderItem(item)) {
+    if (qobject_cast<SliderItem*>(item)) {
         if (value.type() != QVariant::List) {
             return;
         }
@@ -77,20 +101,30 @@ void Container::setItemValue(int id, const QVariant& value, bool emitSignal)
 
 void Container::updateItems()
 {
-    const QList<QPointer<Item>> all = sliderItems(m_header, m_footer, items());
-    for (const QPointer<Item>& item : all) {
-        if (item) {
-            item->cancelAnimations();
+    const QList<QPointer<SliderItem>> all = sliderItems(m_header, m_footer, items());
+    for (const QPointer<SliderItem>& item : all) {
+        if (item && item->slider()) {
+            item->slider()->cancelAnimations();
         }
-        if (item) {
-            // A scrolled slider item brings its handles to their places.
-            item->onItemScrolled();
+        if (item && item->slider()) {
+            item->slider()->updateNubsiePositions(false);
         }
     }
 }
 
-void Container::stackNubsiesOver(QWidget* /*over*/)
+void Container::stackNubsiesOver(QWidget* over)
 {
+    const QList<QPointer<SliderItem>> all = sliderItems(m_header, m_footer, items());
+    for (const QPointer<SliderItem>& item : all) {
+        if (!item || !item->slider()) {
+            continue;
+        }
+        if (over) {
+            item->slider()->stackNubsiesOver(over);
+        } else {
+            item->slider()->raiseNubsies();
+        }
+    }
 }
 
 void Container::raiseContainer(QWidget* over)

@@ -141,6 +141,9 @@ public:
     static void setSecurityManager(std::shared_ptr<vx::ISecurityManager> manager);
     static std::shared_ptr<vx::ISecurityManager> securityManager();
 
+    /// Gives the item a context menu, a popover with this one entry; an empty text takes it away. Needs the Manager.
+    void setResetPopover(const QString& text);
+
     /// Swallows mouse presses and releases of what it is installed on while isProtected(). Clients install it, for
     /// instance on a control; the item does not.
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -153,7 +156,13 @@ Q_SIGNALS:
         int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
     /// A drag of the item is about to begin. The drag runs in a local event loop right after this.
     void itemDragStarted();
-    // The signals of the context menu come next.
+    /// The user asked for the context menu, and setResetPopover() gave the item one; it opens right after.
+    void contextMenuRequested(const QPoint& pos);
+    /// The one entry of the context menu was chosen.
+    void resetContextMenuPerformed();
+
+private Q_SLOTS:
+    void openContextMenu(const QPoint& pos);
 
 protected:
     /// The elements that @p flags name, with these texts. An empty @p text gives no text element; with flags that

@@ -9,6 +9,7 @@
 #include <QtWidgets/QLineEdit>
 
 #include "Registry.h"
+#include "RowSteps.h"
 
 namespace zelkovtest
 {
@@ -55,6 +56,7 @@ Entry popoverItem()
         {"drag", {"itemDragStarted"},
             {mousePress(QPoint(20, 10), 1000), mouseMove(QPoint(25, 10), 1010), mouseMove(QPoint(60, 12), 1020),
                 mouseRelease(QPoint(60, 12), 1030)}},
+        resetByMenu(),
     };
     entry.setters = {
         setter("setText", &pw::Item::setText),
@@ -91,6 +93,7 @@ Entry popoverWidgetItem()
                 call(&pw::Item::performSingleClick, QFlags<pw::EItemPerformedFlag>())}},
         {"drag", {"itemDragStarted"},
             {mousePress(QPoint(2, 2), 1000), mouseMove(QPoint(30, 2), 1010), mouseRelease(QPoint(30, 2), 1020)}},
+        resetByMenu(),
     };
     entry.setters = {setter("setValue", &pw::Item::setValue)};
     return entry;

@@ -13,7 +13,7 @@ const std::vector<Entry>& registry()
                 nubsieEntries(), timeLineEntries(),
                 viewsEntries(),
                 popoverItemEntries(), balloonEntries(), controllerEntries(), modelsEntries(), clickEntries(),
-                labelEntries(), switchEntries(), editsEntries(), overlayEntries(), controlsEntries()}) {
+                labelEntries(), switchEntries(), editsEntries(), overlayEntries(), controlsEntries(), rowEntries()}) {
             all.insert(all.end(), room.begin(), room.end());
         }
         return all;

@@ -92,6 +92,7 @@ std::vector<Entry> overlayEntries();
 std::vector<Entry> controlsEntries();
 std::vector<Entry> switchEntries();
 std::vector<Entry> controllerEntries();
+std::vector<Entry> rowEntries();
 
 // --- Words for entries -----------------------------------------------------------------------------------------
 
