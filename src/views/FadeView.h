@@ -48,6 +48,9 @@ public:
     };
     Q_ENUM(EPositions)
 
+    static constexpr int c_Duration = ::c_Duration;
+    static constexpr int c_Bordersize = ::c_Bordersize;
+
     /// \a widget is for subclasses; this class makes no use of it. A new panel counts as open, though it has the
     /// height hint of the strip.
     FadeView(EPositions position, QWidget* widget, QWidget* parent);

@@ -60,6 +60,8 @@ void TestFadeView::theNumbersStand()
     QCOMPARE(int(FadeView::ePositionBottom), 1);
     QCOMPARE(c_Duration, 300);
     QCOMPARE(c_Bordersize, 15);
+    QCOMPARE(FadeView::c_Duration, 300);
+    QCOMPARE(FadeView::c_Bordersize, 15);
     const QMetaObject& meta = FadeView::staticMetaObject;
     QStringList signalNames;
     QStringList slotNames;
