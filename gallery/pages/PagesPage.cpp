@@ -10,8 +10,8 @@
 #include <QtWidgets/QPushButton>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/CameraTile.h"
+#include "../Hand.h"
 #include "views/NavigationViewController.h"
 #include "views/WidgetSlideshow.h"
 
@@ -44,8 +44,8 @@ PagesPage::PagesPage(SignalLog& log, QWidget* parent)
     showState();
 }
 
-QWidget* PagesPage::makeStep(const QString& title, const QString& text,
-                             const QVector<QPair<QString, QString>>& rows)
+QWidget* PagesPage::makeStep(
+    const QString& title, const QString& text, const QVector<QPair<QString, QString>>& rows)
 {
     auto* step = new QWidget;
     step->setObjectName(title);
@@ -72,11 +72,11 @@ QWidget* PagesPage::makeAssistant()
     m_pages = new vx::NavigationViewController(s_slideMillis, QEasingCurve::OutCubic);
     watch(m_pages, QStringLiteral("pages"));
     m_pages->addWidget(makeStep(tr("Camera"), tr("What the new camera is called and where it hangs."),
-                                {{tr("Name"), tr("North gate")}, {tr("Building"), tr("Yard")}}));
+        {{tr("Name"), tr("North gate")}, {tr("Building"), tr("Yard")}}));
     m_pages->addWidget(makeStep(tr("Network"), tr("Where the camera is reached. The port is rarely another one."),
-                                {{tr("Address"), QStringLiteral("192.0.2.17")}, {tr("Port"), QStringLiteral("554")}}));
+        {{tr("Address"), QStringLiteral("192.0.2.17")}, {tr("Port"), QStringLiteral("554")}}));
     m_pages->addWidget(makeStep(tr("Recording"), tr("How long pictures are kept, and how many a second."),
-                                {{tr("Days"), QStringLiteral("30")}, {tr("Pictures"), QStringLiteral("25")}}));
+        {{tr("Days"), QStringLiteral("30")}, {tr("Pictures"), QStringLiteral("25")}}));
 
     m_back = new QPushButton(tr("Back"));
     m_forward = new QPushButton(tr("Next"));

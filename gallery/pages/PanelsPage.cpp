@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Two panels over a moving picture, the lower one with a time line. They place themselves, so the page tells them when the view was resized.
+// Two panels over a moving picture, the lower one with a time line. They place themselves, so the page tells them
+// when the view was resized.
 #include "PanelsPage.h"
 
 #include <QtCore/QDateTime>
@@ -11,9 +12,9 @@
 #include <QtWidgets/QPushButton>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/CameraTile.h"
 #include "../cameras/Scene.h"
+#include "../Hand.h"
 #include "sliders/MultiNubsieSlider.h"
 #include "views/FadeStripeView.h"
 
@@ -51,7 +52,8 @@ QVector<QPixmap> picturesOf(int seed, double ratio)
 }
 
 PictureRows::PictureRows(QWidget* parent)
-    : QWidget(parent), m_pictures(picturesOf(14, devicePixelRatioF()))
+    : QWidget(parent)
+    , m_pictures(picturesOf(14, devicePixelRatioF()))
 {
 }
 
@@ -68,7 +70,8 @@ void PictureRows::paintEvent(QPaintEvent*)
 }
 
 PicturePanel::PicturePanel(EPositions position, const QString& caption, int seed, QWidget* parent)
-    : FadeView(position, nullptr, parent), m_caption(caption)
+    : FadeView(position, nullptr, parent)
+    , m_caption(caption)
 {
     m_pictures = picturesOf(seed, devicePixelRatioF());
     setAutoFillBackground(false);
@@ -112,7 +115,8 @@ void PicturePanel::mouseReleaseEvent(QMouseEvent* event)
 }
 
 PanelsPage::PanelsPage(SignalLog& log, QWidget* parent)
-    : Page(log, parent), m_view(new QWidget)
+    : Page(log, parent)
+    , m_view(new QWidget)
 {
     m_view->setMinimumHeight(300);
     m_camera = new CameraTile(tr("North gate"), 3, m_view);
@@ -132,8 +136,8 @@ PanelsPage::PanelsPage(SignalLog& log, QWidget* parent)
     layout->addWidget(makeSettings());
 
     m_frames.setInterval(s_frameMillis);
-    connect(&m_frames, &QTimer::timeout, m_camera,
-            [this] { m_camera->advance(QDateTime::currentMSecsSinceEpoch()); });
+    connect(
+        &m_frames, &QTimer::timeout, m_camera, [this] { m_camera->advance(QDateTime::currentMSecsSinceEpoch()); });
 }
 
 FadeStripeView* PanelsPage::makeStripe()
@@ -146,7 +150,7 @@ FadeStripeView* PanelsPage::makeStripe()
     stripe->setRows(0);
     stripe->show();
     watch(stripe, QStringLiteral("bottom"),
-          {QStringLiteral("geometryChanged"), QStringLiteral("sizeChanged"), QStringLiteral("heightChanged")});
+        {QStringLiteral("geometryChanged"), QStringLiteral("sizeChanged"), QStringLiteral("heightChanged")});
     announcePlace(stripe, QStringLiteral("bottom"));
     return stripe;
 }

@@ -11,8 +11,8 @@
 #include <QtWidgets/QPushButton>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/CameraTile.h"
+#include "../Hand.h"
 #include "views/RubberBandWidget.h"
 
 namespace gallery
@@ -25,7 +25,9 @@ const QRgb s_colors[] = {0xff4fb3ff, 0xffffc14d, 0xff6ddc8b, 0xffff7d7d};
 }
 
 RubberBandPage::RubberBandPage(SignalLog& log, QWidget* parent)
-    : Page(log, parent), m_camera(new CameraTile(tr("Container yard"), 2, nullptr)), m_picture(s_camera, m_camera)
+    : Page(log, parent)
+    , m_camera(new CameraTile(tr("Container yard"), 2, nullptr))
+    , m_picture(s_camera, m_camera)
 {
     m_camera->setMinimumHeight(300);
     m_camera->installEventFilter(this);
@@ -43,8 +45,8 @@ RubberBandPage::RubberBandPage(SignalLog& log, QWidget* parent)
     select(gate);
 
     m_frames.setInterval(s_frameMillis);
-    connect(&m_frames, &QTimer::timeout, m_camera,
-            [this] { m_camera->advance(QDateTime::currentMSecsSinceEpoch()); });
+    connect(
+        &m_frames, &QTimer::timeout, m_camera, [this] { m_camera->advance(QDateTime::currentMSecsSinceEpoch()); });
 }
 
 QWidget* RubberBandPage::makeSettings()

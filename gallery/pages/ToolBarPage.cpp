@@ -13,8 +13,8 @@
 #include <QtWidgets/QLabel>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/Scene.h"
+#include "../Hand.h"
 #include "views/CustomToolBar.h"
 
 namespace gallery
@@ -89,19 +89,24 @@ QMimeData* ActionList::mimeData(const QList<QListWidgetItem*> items) const
 const QVector<ToolBarPage::Tool>& ToolBarPage::tools()
 {
     static const QVector<Tool> list = {
-        {"back", QT_TR_NOOP("Back")},         {"play", QT_TR_NOOP("Play")},
-        {"pause", QT_TR_NOOP("Pause")},       {"forward", QT_TR_NOOP("Forward")},
-        {"record", QT_TR_NOOP("Record")},     {"snapshot", QT_TR_NOOP("Snapshot")},
-        {"wall", QT_TR_NOOP("Camera wall")}, {"flag", QT_TR_NOOP("Flag")},
+        {"back", QT_TR_NOOP("Back")},
+        {"play", QT_TR_NOOP("Play")},
+        {"pause", QT_TR_NOOP("Pause")},
+        {"forward", QT_TR_NOOP("Forward")},
+        {"record", QT_TR_NOOP("Record")},
+        {"snapshot", QT_TR_NOOP("Snapshot")},
+        {"wall", QT_TR_NOOP("Camera wall")},
+        {"flag", QT_TR_NOOP("Flag")},
     };
     return list;
 }
 
 ToolBarPage::ToolBarPage(SignalLog& log, QWidget* parent)
-    : Page(log, parent), m_window(new ToolBarWindow)
+    : Page(log, parent)
+    , m_window(new ToolBarWindow)
 {
     m_across = makeBar(QStringLiteral("across"), Qt::Horizontal,
-                       {QStringLiteral("back"), QStringLiteral("play"), QStringLiteral("forward")});
+        {QStringLiteral("back"), QStringLiteral("play"), QStringLiteral("forward")});
     m_down = makeBar(QStringLiteral("down"), Qt::Vertical, {QStringLiteral("wall"), QStringLiteral("snapshot")});
     connect(m_window, &ToolBarWindow::customizeAsked, this, [this] {
         m_list->setFocus();
@@ -142,8 +147,8 @@ QIcon ToolBarPage::icon(const QString& id) const
     pixmap.fill(Qt::transparent);
     QPainter painter(&pixmap);
     painter.setRenderHint(QPainter::Antialiasing);
-    painter.fillPath(signOf(id), id == QLatin1String("record") ? QColor(222, 72, 72)
-                                                               : palette().color(QPalette::WindowText));
+    painter.fillPath(
+        signOf(id), id == QLatin1String("record") ? QColor(222, 72, 72) : palette().color(QPalette::WindowText));
     return QIcon(pixmap);
 }
 
@@ -171,20 +176,20 @@ vx::CustomToolBar* ToolBarPage::makeBar(const QString& id, Qt::Orientation orien
     watch(bar, id);
     announcePlace(bar, id);
     connect(bar, &vx::CustomToolBar::actionDropped, this,
-            [this](QToolBar* target, const QString& actionId, QAction* before) {
-                if (QAction* action = makeAction(actionId)) {
-                    target->insertAction(before, action);
-                    say(before ? tr("%1 before %2").arg(action->text(), before->text())
-                               : tr("%1 at the end").arg(action->text()));
-                }
-            });
+        [this](QToolBar* target, const QString& actionId, QAction* before) {
+            if (QAction* action = makeAction(actionId)) {
+                target->insertAction(before, action);
+                say(before ? tr("%1 before %2").arg(action->text(), before->text())
+                           : tr("%1 at the end").arg(action->text()));
+            }
+        });
     connect(bar, &vx::CustomToolBar::actionRemoved, this, [this](QToolBar* source, QAction* action) {
         source->removeAction(action);
         say(tr("%1 removed").arg(action->text()));
         action->deleteLater();
     });
     connect(bar, &vx::CustomToolBar::toolBarDropped, this,
-            [this](const QString& barId) { say(tr("Bar dropped: %1").arg(barId)); });
+        [this](const QString& barId) { say(tr("Bar dropped: %1").arg(barId)); });
     return bar;
 }
 
@@ -203,7 +208,7 @@ QWidget* ToolBarPage::makeList()
     m_said->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     auto* hint = label(tr("Drag an action onto a bar; right click an action there to remove it. The bars can be "
                           "dragged by their empty part."),
-                       "hint");
+        "hint");
     hint->setWordWrap(true);
 
     QWidget* box = panel();

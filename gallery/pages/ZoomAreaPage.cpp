@@ -11,8 +11,8 @@
 #include <QtWidgets/QScrollBar>
 #include <QtWidgets/QVBoxLayout>
 
-#include "../Hand.h"
 #include "../cameras/Scene.h"
+#include "../Hand.h"
 #include "views/ZoomScrollArea.h"
 
 namespace gallery
@@ -26,7 +26,10 @@ const QSize s_ground(1100, 720);
 }
 
 ZoomAreaPage::ZoomAreaPage(SignalLog& log, QWidget* parent)
-    : Page(log, parent), m_area(new ZoomScrollArea), m_picture(new QLabel), m_percent(label(QString()))
+    : Page(log, parent)
+    , m_area(new ZoomScrollArea)
+    , m_picture(new QLabel)
+    , m_percent(label(QString()))
 {
     m_ground = Scene(2).ground(s_ground, 1.0);
     m_picture->setScaledContents(true);
@@ -34,7 +37,8 @@ ZoomAreaPage::ZoomAreaPage(SignalLog& log, QWidget* parent)
     m_area->setFrameShape(QFrame::NoFrame);
     m_area->setAlignment(Qt::AlignCenter);
     m_area->setWidget(m_picture);
-    watch(m_area, QStringLiteral("area"), {QStringLiteral("updateZoomFactor"), QStringLiteral("scrollAreaChanged")});
+    watch(
+        m_area, QStringLiteral("area"), {QStringLiteral("updateZoomFactor"), QStringLiteral("scrollAreaChanged")});
     announcePlace(m_area, QStringLiteral("area"));
     connect(m_area, &ZoomScrollArea::updateZoomFactor, this, &ZoomAreaPage::zoomBy);
 
@@ -69,8 +73,8 @@ void ZoomAreaPage::setScale(double scale)
 {
     const auto middleOf = [](const QScrollBar* bar) { return bar->value() + bar->pageStep() / 2.0; };
     const double change = scale / m_scale;
-    const QPointF middle(middleOf(m_area->horizontalScrollBar()) * change,
-                         middleOf(m_area->verticalScrollBar()) * change);
+    const QPointF middle(
+        middleOf(m_area->horizontalScrollBar()) * change, middleOf(m_area->verticalScrollBar()) * change);
     m_scale = scale;
     m_picture->resize(m_ground.size() * scale);
     m_area->horizontalScrollBar()->setValue(qRound(middle.x() - m_area->horizontalScrollBar()->pageStep() / 2.0));
@@ -87,7 +91,7 @@ void ZoomAreaPage::rehearse(Hand& hand)
         QWidget* viewport = m_area->viewport();
         const QPoint centre = viewport->rect().center();
         QWheelEvent wheel(centre, viewport->mapToGlobal(centre), QPoint(), QPoint(0, 120), Qt::NoButton,
-                          Qt::NoModifier, Qt::NoScrollPhase, false);
+            Qt::NoModifier, Qt::NoScrollPhase, false);
         QApplication::sendEvent(viewport, &wheel);
     });
     hand.wait(900);

@@ -12,9 +12,9 @@
 
 namespace vx
 {
-/// A QToolBar onto which actions and whole tool bars can be dropped, and that can itself be dragged by its body. It
-/// reports and changes nothing by itself: insert, move or remove the action when actionDropped() or actionRemoved()
-/// says so.
+/// A QToolBar onto which actions and whole tool bars can be dropped, and that can itself be dragged by its body.
+/// It reports and changes nothing by itself: insert, move or remove the action when actionDropped() or
+/// actionRemoved() says so.
 ///
 /// Drags carry one QString in a QDataStream: an id that the client chose, as "application/action-id" or as
 /// "application/toolbar-id". The drag of an action is started by the client, mostly in a dialog with all actions;

@@ -6,14 +6,14 @@
 
 #include <QtCore/QPoint>
 #include <QtCore/QRect>
-#include <QtCore/QVector>
 #include <QtCore/Qt>
+#include <QtCore/QVector>
 
 namespace vx
 {
 /// The number of the item before which a drop at \a point lands: the first in order whose centre lies past the
-/// point, to the right in a horizontal row, below in a vertical one. -1: after all of them. On the centre itself is
-/// past it.
+/// point, to the right in a horizontal row, below in a vertical one. -1: after all of them. On the centre itself
+/// is past it.
 ZELKOV_WIDGETS_EXPORT int dropPosition(
     const QVector<QRect>& items, const QPoint& point, Qt::Orientation orientation);
 }

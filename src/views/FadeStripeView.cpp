@@ -3,9 +3,9 @@
 #include "views/FadeStripeView.h"
 
 #include "CoreQt/Connect.h"
-#include "ZelkovUtils/ReloadStyleSheet.h"
 #include "sliders/MultiNubsieSlider.h"
 #include "views/PanelGeometry.h"
+#include "ZelkovUtils/ReloadStyleSheet.h"
 
 #include <QtCore/QTimer>
 #include <QtGui/QDropEvent>
@@ -347,16 +347,16 @@ int FadeStripeView::draggedHeight(const QMouseEvent* event) const
         return event->y() + m_dragOffset;
     }
     const int parentHeight = parentWidget() != nullptr ? parentWidget()->height() : m_parentHeight;
-    const double height = m_layoutVerticalOffset + (parentHeight - event->windowPos().y()) + m_dragOffset
-        - m_neighbourOffset;
+    const double height
+        = m_layoutVerticalOffset + (parentHeight - event->windowPos().y()) + m_dragOffset - m_neighbourOffset;
     return static_cast<int>(qBound(-1e9, height, 1e9));
 }
 
 void FadeStripeView::dragTo(const QMouseEvent* event)
 {
     m_grab->show();
-    const int dragged = vx::PanelGeometry::widgetHeight(
-        qBound(m_stripeMinimumHeight, draggedHeight(event), m_maximumHeight));
+    const int dragged
+        = vx::PanelGeometry::widgetHeight(qBound(m_stripeMinimumHeight, draggedHeight(event), m_maximumHeight));
     if (m_position == ePositionBottom && !m_partOfLayout) {
         const int parentHeight = parentWidget() != nullptr ? parentWidget()->height() : m_parentHeight;
         move(0, parentHeight - dragged - m_neighbourOffset);

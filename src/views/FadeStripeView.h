@@ -23,8 +23,8 @@ class MultiNubsieSlider;
 /// side that moves, another bar at the edge, and the client's contents in between.
 ///
 /// The user opens and shuts it by a click on the handle, drags the bar to a height that snaps to rows of contents,
-/// and takes a top panel to the full height and back by a double click; at the bottom a double click takes one row.
-/// Drops of accepted mime types are reported.
+/// and takes a top panel to the full height and back by a double click; at the bottom a double click takes one
+/// row. Drops of accepted mime types are reported.
 ///
 /// Heights are those of the whole panel, so 30 more than those of the contents. Call setContentsHeight() before
 /// anything else that speaks of rows.
@@ -49,13 +49,13 @@ public:
     void setRows(int rows);
     /// Always 0.
     int getRows() const;
-    /// The height that a height snaps to: closed below two thirds of a row of contents, one row up to a row and both
-    /// bars, as it is from there on. A release by the user snaps differently, at 0.66: clients rely on it.
+    /// The height that a height snaps to: closed below two thirds of a row of contents, one row up to a row and
+    /// both bars, as it is from there on. A release by the user snaps differently, at 0.66: clients rely on it.
     int snapToSize(int size) const;
     /// Emits sizeChanged() with the present height of the contents, if the panel is open and not at full height.
     void distributeHeight();
-    /// Highest height of the whole panel, for drags, setSizeHint() and layouts. At first the parent's height on top,
-    /// half of it at the bottom. Hides the function of QWidget.
+    /// Highest height of the whole panel, for drags, setSizeHint() and layouts. At first the parent's height on
+    /// top, half of it at the bottom. Hides the function of QWidget.
     void setMaximumHeight(int height);
 
     // A panel with accepted mime types takes drops.

@@ -367,8 +367,7 @@ void FadeView::goFullscreen(bool animated)
     const bool moves = m_position == ePositionTop;
     auto* const movement = new Movement(this, moves);
     if (moves) {
-        vx::connect(
-            movement, "2valueChanged(const QVariant&)", this, "1emitGeometryChange()", Qt::AutoConnection);
+        vx::connect(movement, "2valueChanged(const QVariant&)", this, "1emitGeometryChange()", Qt::AutoConnection);
     }
     vx::connect(movement, "2finished()", this, "1fullscreenEntered()", Qt::AutoConnection);
     movement->setStartValue(geometry());
@@ -419,13 +418,11 @@ void FadeView::exitFullscreen(bool animated)
     const QPointer<FadeView> alive(this);
     auto* const movement = new Movement(this, moves);
     if (moves) {
-        vx::connect(
-            movement, "2valueChanged(const QVariant&)", this, "1emitGeometryChange()", Qt::AutoConnection);
+        vx::connect(movement, "2valueChanged(const QVariant&)", this, "1emitGeometryChange()", Qt::AutoConnection);
     }
     vx::connect(movement, "2finished()", this, "1fullscreenExited()", Qt::AutoConnection);
     movement->setStartValue(geometry());
-    movement->setEndValue(
-        moves ? vx::PanelGeometry::fullRect(surroundings(), m_preFullscreenSize) : geometry());
+    movement->setEndValue(moves ? vx::PanelGeometry::fullRect(surroundings(), m_preFullscreenSize) : geometry());
     if (!alive) {
         delete movement;
         return;

@@ -22,18 +22,18 @@ struct Surroundings;
 }
 
 /// A panel along the top or the bottom edge of its parent that slides from a strip of 15 pixels to its full height
-/// and back, and can take the whole height of the parent. "Fading" is a movement here; nothing becomes transparent.
-/// The class paints nothing of its own: put a layout on it, or use FadeStripeView.
+/// and back, and can take the whole height of the parent. "Fading" is a movement here; nothing becomes
+/// transparent. The class paints nothing of its own: put a layout on it, or use FadeStripeView.
 ///
-/// It works in one of two ways. As part of a layout (the default) it sets its height only, and the layout places it.
-/// Otherwise it places itself over the other children of the parent, in the parent's full width; then call resize()
-/// from the parent's resizeEvent(), since a panel does not watch its parent. The parent is required.
+/// It works in one of two ways. As part of a layout (the default) it sets its height only, and the layout places
+/// it. Otherwise it places itself over the other children of the parent, in the parent's full width; then call
+/// resize() from the parent's resizeEvent(), since a panel does not watch its parent. The parent is required.
 ///
 /// Signals in order, animated: fadein() gives fadingIn, then fadingInFinished and geometryChanged at the end;
 /// fadeout() gives fadingOut, then fadingOutFinished and geometryChanged; goFullscreen() outside a layout gives
 /// appearingFullscreen and changeViewOrientation(Qt::Vertical), then fullscreenAppeared; exitFullscreen() gives
-/// leavingFullscreen, then changeViewOrientation(Qt::Horizontal) and fullscreenLeft. geometryChanged also comes with
-/// every step of a movement, the first of them before the movement is announced.
+/// leavingFullscreen, then changeViewOrientation(Qt::Horizontal) and fullscreenLeft. geometryChanged also comes
+/// with every step of a movement, the first of them before the movement is announced.
 ///
 /// A call during a movement starts another one, which takes over; the former never reports its end.
 class ZELKOV_WIDGETS_EXPORT FadeView : public QWidget
@@ -66,8 +66,8 @@ public:
     void setSizeHint(int size, bool resizeNow);
     /// Which of the two ways the panel works in; a panel put into a layout is shown.
     void setFadeStripeAsPartOfLayout(bool partOfLayout);
-    /// Height of another panel at the same edge. The panel keeps this distance from its edge on top in a layout, and
-    /// at the bottom outside one.
+    /// Height of another panel at the same edge. The panel keeps this distance from its edge on top in a layout,
+    /// and at the bottom outside one.
     void setNeighbourSize(int size);
     QRect geometryOffsetFree() const;
 
@@ -86,22 +86,22 @@ Q_SIGNALS:
     void geometryChanged(const QRect& geometry);
 
 public Q_SLOTS:
-    /// Takes note of the parent's size, or of a larger one, and puts the panel where it belongs. Hides the function
-    /// of QWidget.
+    /// Takes note of the parent's size, or of a larger one, and puts the panel where it belongs. Hides the
+    /// function of QWidget.
     void resize(int width = -1, int height = -1);
     void emitGeometryChange();
     /// In a movement of the first way: takes over the height of a rectangle, if that is valid.
     void changeSize(const QVariant& value);
-    /// Opens to \a size from now on, or to the former size if that is not above 0. With \a force the movement starts
-    /// at the strip and not where the panel is; in a layout it always does. Not animated and outside a layout the
-    /// panel becomes a strip all the same and emits nothing: clients rely on it.
+    /// Opens to \a size from now on, or to the former size if that is not above 0. With \a force the movement
+    /// starts at the strip and not where the panel is; in a layout it always does. Not animated and outside a
+    /// layout the panel becomes a strip all the same and emits nothing: clients rely on it.
     void fadein(bool animated = true, bool force = false, int size = -1);
     /// Closes. Outside a layout the present height is what the next fadein() opens to. With \a force the movement
     /// starts at the full height and not where the panel is; in a layout it always does.
     void fadeout(bool animated = true, bool force = false);
-    /// Takes the parent's full height; outside a layout only. Not animated it emits fullscreenAppeared() at once, but
-    /// does not count as full height. A second call forgets the height to come back to. At the bottom edge the panel
-    /// does not move.
+    /// Takes the parent's full height; outside a layout only. Not animated it emits fullscreenAppeared() at once,
+    /// but does not count as full height. A second call forgets the height to come back to. At the bottom edge the
+    /// panel does not move.
     void goFullscreen(bool animated = true);
     /// Nothing unless isFullscreen(). Not animated the panel becomes a strip.
     void exitFullscreen(bool animated = true);

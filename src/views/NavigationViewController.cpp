@@ -12,8 +12,8 @@ namespace vx
 {
 namespace
 {
-/// The movement of one page. A group starts what has stopped in it again with each tick, and Qt would complain each
-/// time when the page has died.
+/// The movement of one page. A group starts what has stopped in it again with each tick, and Qt would complain
+/// each time when the page has died.
 class PageSlide : public QPropertyAnimation
 {
 public:

@@ -9,13 +9,13 @@
 
 namespace vx
 {
-/// A QStackedWidget whose pages slide in from the side where they stand in the order, and that tells of each page's
-/// coming and going.
+/// A QStackedWidget whose pages slide in from the side where they stand in the order, and that tells of each
+/// page's coming and going.
 ///
-/// setCurrentIndexWithAnimation() emits viewWillDisappear(old) and viewWillAppear(next), slides, and when the slide
-/// has ended changes the current index and emits viewDidDisappear(old) and viewDidAppear(next), all with `animated`
-/// true. setCurrentIndex() does the same at once with `animated` false. The current index is the old page's until
-/// the slide ends; animatedIndex() is where it is going.
+/// setCurrentIndexWithAnimation() emits viewWillDisappear(old) and viewWillAppear(next), slides, and when the
+/// slide has ended changes the current index and emits viewDidDisappear(old) and viewDidAppear(next), all with
+/// `animated` true. setCurrentIndex() does the same at once with `animated` false. The current index is the old
+/// page's until the slide ends; animatedIndex() is where it is going.
 ///
 /// A slide started during another one takes over, and the former never reports its end. Only where the two have no
 /// page in common, after a setCurrentIndex() in between, do both go on: the first to end changes to the later

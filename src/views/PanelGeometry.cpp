@@ -62,7 +62,7 @@ QRect fullRect(const Surroundings& s, int height)
 
 QVector<int> rowHeights(int contentsHeight, int maximumRows)
 {
-    QVector<int> heights{c_Strip};
+    QVector<int> heights {c_Strip};
     for (int i = 1; i <= maximumRows; ++i) {
         const qint64 height = qint64(i) * contentsHeight + c_Bars;
         heights.append(static_cast<int>(qBound(-c_Farthest, height, c_Farthest)));

@@ -9,8 +9,8 @@
 
 namespace vx
 {
-/// The thinking of FadeView and FadeStripeView. All lengths are logical pixels; rectangles are in coordinates of the
-/// parent. Edges are the numbers of FadeView::EPositions.
+/// The thinking of FadeView and FadeStripeView. All lengths are logical pixels; rectangles are in coordinates of
+/// the parent. Edges are the numbers of FadeView::EPositions.
 namespace PanelGeometry
 {
 constexpr int c_Top = 0;
@@ -50,8 +50,8 @@ constexpr bool isOpen(int height)
     return height > c_Strip;
 }
 
-/// How far from its edge a panel has to stay for a neighbour of this size: one in a layout gives way on the top edge
-/// only, one outside on the bottom edge only.
+/// How far from its edge a panel has to stay for a neighbour of this size: one in a layout gives way on the top
+/// edge only, one outside on the bottom edge only.
 constexpr int neighbourOffset(int edge, bool partOfLayout, int neighbourSize)
 {
     return (edge == c_Top) == partOfLayout ? neighbourSize : 0;

@@ -2,8 +2,8 @@
 // vx::RubberBandWidget: a rectangle over a view that the user moves and resizes.
 #pragma once
 
-#include "ZelkovUtils/CoordinateSystem.h"
 #include "foundation/Export.h"
+#include "ZelkovUtils/CoordinateSystem.h"
 
 #include <QtCore/QPoint>
 #include <QtCore/QRect>
@@ -22,9 +22,9 @@ namespace vx
 /// Marks a region of what its parent shows: a frame with a translucent fill, a label and a close button. The user
 /// moves it by its inside and resizes it by edges and corners; Shift keeps the proportions.
 ///
-/// What is edited is the rectangle in the application's units, and the widget follows it: a CoordinateSystem, which
-/// is not owned and has to outlive its use here, converts between the two. Its screen pixels are those of the
-/// parent. A band does not follow changes of the scale by itself: give it its geometry again with
+/// What is edited is the rectangle in the application's units, and the widget follows it: a CoordinateSystem,
+/// which is not owned and has to outlive its use here, converts between the two. Its screen pixels are those of
+/// the parent. A band does not follow changes of the scale by itself: give it its geometry again with
 /// setApplicationGeometry() when the parent was resized.
 ///
 /// The widget is 4 pixels larger on each side than the marked area, so that the edges can be gripped from outside.
@@ -165,7 +165,7 @@ private:
     QLabel* m_label;
     QPushButton* m_closeButton;
     Grip m_grip = gNone;
-    QPoint m_dragStart{-1, -1}; // global; a negative x means no drag
+    QPoint m_dragStart {-1, -1}; // global; a negative x means no drag
     QRect m_dragStartGeometry;
     QRectF m_dragStartApplicationGeometry;
 };

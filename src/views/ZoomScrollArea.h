@@ -27,8 +27,8 @@ public:
     QScrollBar* verticalNicerScrollBar() const;
     /// Default on: the bars are shown as needed.
     void enableScrollbars(bool enable);
-    /// Says that the user works by touch, as a touch does. It is forgotten 2000 ms after the last call or touch, so
-    /// false merely starts that time.
+    /// Says that the user works by touch, as a touch does. It is forgotten 2000 ms after the last call or touch,
+    /// so false merely starts that time.
     void setTouchActive(bool active);
 
 Q_SIGNALS:

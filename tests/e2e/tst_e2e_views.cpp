@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: MIT
 // A real pointer resizes a rubber band, drags an action into a tool bar and turns the wheel over the zoom area.
-#include "ZelkovUtils/LinearCoordinateSystem.h"
+#include "sliders/MultiNubsieSlider.h"
 #include "support/SignalRecorder.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
-#include "sliders/MultiNubsieSlider.h"
 #include "views/CustomToolBar.h"
 #include "views/FadeStripeView.h"
 #include "views/RubberBandWidget.h"
 #include "views/ZoomScrollArea.h"
+#include "ZelkovUtils/LinearCoordinateSystem.h"
 
 #include <QtCore/QDataStream>
 #include <QtCore/QMimeData>
@@ -115,7 +115,7 @@ public:
     using QWidget::QWidget;
 
 protected:
-    void mousePressEvent(QMouseEvent*) override {}
+    void mousePressEvent(QMouseEvent*) override { }
     void mouseMoveEvent(QMouseEvent*) override
     {
         QByteArray id;
@@ -257,7 +257,8 @@ void TestE2eViews::theWheelZooms()
     pointer(at(area, QPoint(150, 150)) + word(" click 4"));
     QTRY_VERIFY(recorder.count(word("updateZoomFactor")) > 2);
     QCOMPARE(recorder.entries().last().arguments.first().toDouble(), 1.0);
-    pointer(at(*area.verticalNicerScrollBar(), area.verticalNicerScrollBar()->rect().center()) + word(" click 5 click 5"));
+    pointer(at(*area.verticalNicerScrollBar(), area.verticalNicerScrollBar()->rect().center())
+        + word(" click 5 click 5"));
     QTRY_COMPARE(recorder.entries().last().arguments.first().toDouble(), -1.0);
     QTRY_COMPARE_WITH_TIMEOUT(recorder.entries().last().arguments.first().toDouble(), 0.0, 3000);
     QCOMPARE(area.verticalScrollBar()->value(), 0);

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
 // The classes of views/.
-#include "ZelkovUtils/LinearCoordinateSystem.h"
 #include "views/CustomToolBar.h"
 #include "views/FadeStripeView.h"
 #include "views/FadeView.h"
@@ -8,6 +7,7 @@
 #include "views/RubberBandWidget.h"
 #include "views/WidgetSlideshow.h"
 #include "views/ZoomScrollArea.h"
+#include "ZelkovUtils/LinearCoordinateSystem.h"
 
 #include <QtCore/QDataStream>
 #include <QtCore/QMimeData>
@@ -48,7 +48,8 @@ Step viewsDrop(const char* format)
     };
 }
 
-// --- Rubber band -------------------------------------------------------------------------------------------------
+// --- Rubber band
+// -------------------------------------------------------------------------------------------------
 
 Step viewsFocus(QEvent::Type type)
 {
@@ -74,7 +75,7 @@ Entry rubberBandWidget()
         band->setCoordinateSystem(system.get());
         band->setApplicationGeometry(QRectF(0.1, 0.1, 0.6, 0.6));
         band->setLabel(QStringLiteral("Door"));
-        return Subject{band, band};
+        return Subject {band, band};
     };
     entry.exercise = {
         {"hover", {"mouseEntered", "mouseLeft"}, {enter(c_viewsCentre), leave()}},
@@ -86,10 +87,9 @@ Entry rubberBandWidget()
         {"select", {"selected", "selectionLost"},
             {call(&RubberBandWidget::select, true), call(&RubberBandWidget::select, false)}},
         // By hand and not with click(): the button touches itself again after its signal unless it lives.
-        {"close", {"closeClicked"},
-            {[](const Subject& subject) {
-                QMetaObject::invokeMethod(subject.object, "onClose", Qt::DirectConnection);
-            }}},
+        {"close", {"closeClicked"}, {[](const Subject& subject) {
+             QMetaObject::invokeMethod(subject.object, "onClose", Qt::DirectConnection);
+         }}},
     };
     entry.setters = {
         setter("setApplicationGeometry", &RubberBandWidget::setApplicationGeometry),
@@ -107,7 +107,8 @@ Entry rubberBandWidget()
     return entry;
 }
 
-// --- Panel -------------------------------------------------------------------------------------------------------
+// --- Panel
+// -------------------------------------------------------------------------------------------------------
 
 Entry fadeView()
 {
@@ -118,7 +119,7 @@ Entry fadeView()
     entry.create = [](QWidget* host) {
         auto* const view = new FadeView(FadeView::ePositionTop, nullptr, host);
         view->setFadeStripeAsPartOfLayout(false);
-        return Subject{view, view};
+        return Subject {view, view};
     };
     entry.exercise = {
         {"open", {"geometryChanged", "fadingIn", "fadingInFinished"},
@@ -156,7 +157,7 @@ Entry fadeStripeView()
         stripe->setFadeStripeAsPartOfLayout(false);
         stripe->setContentsHeight(40);
         stripe->setRows(1);
-        return Subject{stripe, stripe};
+        return Subject {stripe, stripe};
     };
     constexpr QPoint header(20, 5);
     constexpr QPoint footer(20, 60);
@@ -172,14 +173,16 @@ Entry fadeStripeView()
         {"inactive", {"inactiveClicked"},
             {close, call(&FadeStripeView::setActive, false), mousePress(header, 0), mouseRelease(header, 10)}},
         {"drag", {"sizeChanged", "heightChanged"},
-            {mousePress(footer, 0), mouseMove(footer + QPoint(0, 30), 10), mouseRelease(footer + QPoint(0, 30), 20)}},
-        {"double click", {}, {mousePress(QPoint(100, 60), 0), mouseRelease(QPoint(100, 60), 10),
-            mouseDoubleClick(QPoint(100, 60), 20), mouseRelease(QPoint(100, 60), 30)}},
+            {mousePress(footer, 0), mouseMove(footer + QPoint(0, 30), 10),
+                mouseRelease(footer + QPoint(0, 30), 20)}},
+        {"double click", {},
+            {mousePress(QPoint(100, 60), 0), mouseRelease(QPoint(100, 60), 10),
+                mouseDoubleClick(QPoint(100, 60), 20), mouseRelease(QPoint(100, 60), 30)}},
         {"drop", {"dragAccepted"},
             {[](const Subject& subject) {
-                static_cast<FadeStripeView*>(subject.object.data())
-                    ->addAcceptedMimeType(QStringLiteral("application/action-id"));
-            },
+                 static_cast<FadeStripeView*>(subject.object.data())
+                     ->addAcceptedMimeType(QStringLiteral("application/action-id"));
+             },
                 viewsDrop("application/action-id")}},
     };
     entry.exercise.insert(entry.exercise.end(), own.begin(), own.end());
@@ -193,7 +196,8 @@ Entry fadeStripeView()
     return entry;
 }
 
-// --- Pages -------------------------------------------------------------------------------------------------------
+// --- Pages
+// -------------------------------------------------------------------------------------------------------
 
 Entry navigationViewController()
 {
@@ -207,7 +211,7 @@ Entry navigationViewController()
         for (int i = 0; i < 3; ++i) {
             pages->addWidget(new QPushButton(QString::number(i)));
         }
-        return Subject{pages, pages};
+        return Subject {pages, pages};
     };
     entry.exercise = {
         {"slide", {"viewWillDisappear", "viewWillAppear", "viewDidDisappear", "viewDidAppear"},
@@ -229,12 +233,13 @@ Entry widgetSlideshow()
     entry.header = "views/WidgetSlideshow.h";
     entry.create = [](QWidget* host) {
         auto* const pages = new WidgetSlideshow({new QPushButton, new QPushButton, new QPushButton}, host);
-        return Subject{pages, pages};
+        return Subject {pages, pages};
     };
     return entry;
 }
 
-// --- Zoom --------------------------------------------------------------------------------------------------------
+// --- Zoom
+// --------------------------------------------------------------------------------------------------------
 
 Step viewsWheel(int angle)
 {
@@ -255,14 +260,13 @@ Entry zoomScrollArea()
         auto* const content = new QWidget;
         content->resize(900, 700);
         area->setWidget(content);
-        return Subject{area, area};
+        return Subject {area, area};
     };
     entry.exercise = {
         {"wheel", {"updateZoomFactor"}, {viewsWheel(120), waitFor("updateZoomFactor"), viewsWheel(-240)}},
-        {"scroll", {"scrollAreaChanged"},
-            {[](const Subject& subject) {
-                static_cast<QScrollArea*>(subject.widget.data())->verticalScrollBar()->setValue(50);
-            }}},
+        {"scroll", {"scrollAreaChanged"}, {[](const Subject& subject) {
+             static_cast<QScrollArea*>(subject.widget.data())->verticalScrollBar()->setValue(50);
+         }}},
     };
     entry.setters = {
         setter("enableScrollbars", &ZoomScrollArea::enableScrollbars),
@@ -271,7 +275,8 @@ Entry zoomScrollArea()
     return entry;
 }
 
-// --- Tool bar ----------------------------------------------------------------------------------------------------
+// --- Tool bar
+// ----------------------------------------------------------------------------------------------------
 
 // Opens the menu of the first action and chooses the entry that removes it.
 void viewsRemoveFirstItem(const Subject& subject)
@@ -307,7 +312,7 @@ Entry customToolBar()
         bar->addAction(QStringLiteral("One"));
         bar->addAction(QStringLiteral("Two"));
         bar->resize(180, 40);
-        return Subject{bar, bar};
+        return Subject {bar, bar};
     };
     entry.exercise = {
         {"drop an action", {"actionDropped"}, {viewsDrop("application/action-id")}},

@@ -1,221 +1,21 @@
 // SPDX-License-Identifier: MIT
-// The tool bar that takes part in customising: real drags, drops, its menu and its log.
-#include "support/LogCapture.h"
-#include "support/SignalRecorder.h"
-#include "support/TestCase.h"
+// The tool bar that takes part in customising: real drags, drops and its log.
 #include "support/TestMain.h"
-#include "views/CustomToolBar.h"
+#include "ToolBarScene.h"
 
-#include <QtCore/QDataStream>
-#include <QtCore/QMimeData>
-#include <QtCore/QPointer>
-#include <QtCore/QTimer>
-#include <QtGui/QContextMenuEvent>
-#include <QtGui/QDrag>
-#include <QtGui/QMouseEvent>
-#include <QtGui/QWindow>
-#include <QtTest/QtTest>
-#include <QtWidgets/QApplication>
-#include <QtWidgets/QBoxLayout>
-#include <QtWidgets/QMenu>
-
-#include <functional>
-#include <memory>
+using toolbarscene::addSpacer;
+using toolbarscene::c_Action;
+using toolbarscene::c_OnSource;
+using toolbarscene::c_ToolBar;
+using toolbarscene::Dragged;
+using toolbarscene::Host;
+using toolbarscene::packed;
+using toolbarscene::Scene;
+using toolbarscene::word;
 
 using vx::CustomToolBar;
 using zelkovtest::LogCapture;
 using zelkovtest::SignalRecorder;
-
-namespace
-{
-const char c_Action[] = "application/action-id";
-const char c_ToolBar[] = "application/toolbar-id";
-
-/// Calls a private member function of the bar: nobody in the library does.
-template<void (CustomToolBar::*function)()>
-struct AddSpacer
-{
-    friend void addSpacer(CustomToolBar& bar) { (bar.*function)(); }
-};
-void addSpacer(CustomToolBar& bar);
-template struct AddSpacer<&CustomToolBar::addSpacer>;
-
-QString word(const char* text)
-{
-    return QString::fromLatin1(text);
-}
-
-QByteArray packed(const QString& id)
-{
-    QByteArray result;
-    QDataStream stream(&result, QIODevice::WriteOnly);
-    stream << id;
-    return result;
-}
-
-/// What a client's dialog does: a press and a move start the drag of an action.
-class ActionSource : public QWidget
-{
-public:
-    using QWidget::QWidget;
-    Qt::DropAction result = Qt::IgnoreAction;
-    QByteArray format = c_Action;
-
-protected:
-    void mousePressEvent(QMouseEvent*) override {}
-    void mouseMoveEvent(QMouseEvent*) override
-    {
-        auto* const mimeData = new QMimeData;
-        mimeData->setData(QString::fromLatin1(format), packed(word("zoom-in")));
-        auto* const drag = new QDrag(this);
-        drag->setMimeData(mimeData);
-        const QPointer<ActionSource> alive(this);
-        const Qt::DropAction action = drag->exec(Qt::MoveAction | Qt::CopyAction, Qt::MoveAction);
-        if (alive) {
-            result = action;
-        }
-    }
-};
-
-/// Takes drag events without the entering that Qt asks for.
-class OpenBar : public CustomToolBar
-{
-public:
-    using CustomToolBar::CustomToolBar;
-    using CustomToolBar::dragEnterEvent;
-    using CustomToolBar::dragLeaveEvent;
-    using CustomToolBar::dragMoveEvent;
-    using CustomToolBar::dropEvent;
-};
-
-class Host : public QWidget
-{
-    Q_OBJECT
-
-public:
-    int customized = 0;
-
-public Q_SLOTS:
-    void customizeToolBar() { ++customized; }
-};
-
-/// A window with a bar of three actions of 30 by 24 pixels and a source of actions.
-struct Scene
-{
-    explicit Scene(Qt::Orientation orientation = Qt::Horizontal, bool draggable = true)
-    {
-        host.resize(220, 260);
-        bar = new OpenBar(word("Tools"), &host, draggable, word("tools"));
-        bar->setOrientation(orientation);
-        bar->setIconSize(QSize(24, 24));
-        for (const char* name : {"one", "two", "three"}) {
-            actions << bar->addAction(word(name));
-        }
-        if (orientation == Qt::Horizontal) {
-            bar->setGeometry(0, 0, 220, 40);
-        } else {
-            bar->setGeometry(0, 0, 60, 200);
-        }
-        source = new ActionSource(&host);
-        source->setGeometry(100, 210, 60, 40);
-        host.show();
-        if (!QTest::qWaitForWindowExposed(&host)) {
-            qFatal("no window");
-        }
-        recorder.add(bar);
-    }
-
-    QRect place(int index) const { return bar->widgetForAction(actions.at(index))->geometry(); }
-
-    void send(QEvent::Type type, const QPoint& at, Qt::MouseButton button = Qt::LeftButton)
-    {
-        static int time = 1000;
-        QWindow* const window = host.windowHandle();
-        const Qt::MouseButtons buttons = type == QEvent::MouseButtonRelease ? Qt::NoButton : button;
-        qt_handleMouseEvent(window, at, window->mapToGlobal(at), buttons,
-            type == QEvent::MouseMove ? Qt::NoButton : button, type, Qt::NoModifier, ++time);
-        QCoreApplication::processEvents();
-    }
-
-    /// Presses, starts the drag by a move of 30 pixels, goes through the points and releases. Anything left over
-    /// after three seconds is cancelled.
-    void drag(const QPoint& from, const QVector<QPoint>& through, const std::function<void()>& inBetween = {})
-    {
-        QTimer guard;
-        QObject::connect(&guard, &QTimer::timeout, [] { QDrag::cancel(); });
-        guard.setSingleShot(true);
-        guard.start(3000);
-        int delay = 10;
-        for (const QPoint& point : through) {
-            QTimer::singleShot(delay, &host, [this, point] { send(QEvent::MouseMove, point); });
-            delay += 10;
-        }
-        if (inBetween) {
-            QTimer::singleShot(delay, &host, inBetween);
-            delay += 10;
-        }
-        const QPoint last = through.isEmpty() ? from : through.last();
-        QTimer::singleShot(delay, &host, [this, last] { send(QEvent::MouseButtonRelease, last); });
-        send(QEvent::MouseMove, from);
-        send(QEvent::MouseButtonPress, from);
-        send(QEvent::MouseMove, from + QPoint(15, 15));
-        QTRY_VERIFY(QGuiApplication::mouseButtons() == Qt::NoButton);
-        QCoreApplication::processEvents();
-    }
-
-    Host host;
-    OpenBar* bar;
-    ActionSource* source;
-    QList<QAction*> actions;
-    SignalRecorder recorder;
-};
-
-/// Runs an event handler of the bar with a drag event of its own.
-struct Dragged
-{
-    Dragged(OpenBar* target, const QString& format, const QByteArray& bytes)
-        : bar(target)
-    {
-        if (!format.isEmpty()) {
-            data.setData(format, bytes);
-        }
-    }
-
-    bool enter()
-    {
-        QDragEnterEvent event(QPoint(1, 1), Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        event.setAccepted(false);
-        bar->dragEnterEvent(&event);
-        return event.isAccepted();
-    }
-    bool move(const QPoint& at)
-    {
-        QDragMoveEvent event(at, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        event.setAccepted(false);
-        bar->dragMoveEvent(&event);
-        return event.isAccepted();
-    }
-    bool leave() const
-    {
-        QDragLeaveEvent event;
-        event.setAccepted(false);
-        bar->dragLeaveEvent(&event);
-        return event.isAccepted();
-    }
-    bool drop(const QPoint& at)
-    {
-        QDropEvent event(at, Qt::MoveAction, &data, Qt::LeftButton, Qt::NoModifier);
-        event.setAccepted(false);
-        bar->dropEvent(&event);
-        return event.isAccepted() && event.dropAction() == Qt::MoveAction;
-    }
-
-    OpenBar* bar;
-    QMimeData data;
-};
-
-const QPoint c_OnSource(120, 225);
-}
 
 class TestCustomToolBar : public zelkovtest::TestCase
 {
@@ -236,7 +36,6 @@ private Q_SLOTS:
     void theBarMayDieWhileItIsDragged();
     void theBarMayDieOfADrop_data();
     void theBarMayDieOfADrop();
-
     void entersWantOneOfTheTwoFormats();
     void movesWantOneOfTheTwoFormats();
     void theActionFormatGoesFirst();
@@ -248,18 +47,6 @@ private Q_SLOTS:
     void theSpacerIsWideOrWider();
     void anActionThatDiedIsNoPlace();
     void everyStepIsLogged();
-
-    void theMenuIsAFixedPicture();
-    void removeItemReportsTheAction();
-    void otherEntriesReportNothing();
-    void customizeGoesToTheParent();
-    void withoutThatSlotNothingBreaks();
-    void anEmptyPartHasNoMenuOfThisClass();
-    void theBarMayDieWhileItsMenuIsOpen();
-
-private:
-    // Opens the menu on the action and calls what to do with it from its loop.
-    static void openMenu(Scene& scene, int index, const std::function<void(QMenu*)>& use);
 };
 
 void TestCustomToolBar::bothConstructorsTakeDrops()
@@ -298,7 +85,7 @@ void TestCustomToolBar::aRealDragOfAnActionLandsBeforeTheNextCentre()
     const QPoint centre = scene.place(index).center();
     const QPoint at = centre + (orientation == Qt::Horizontal ? QPoint(offset, 5) : QPoint(5, offset));
     scene.drag(c_OnSource, {QPoint(50, 100), at + QPoint(1, 1), at});
-    QCOMPARE(scene.recorder.names(), QStringList{word("actionDropped")});
+    QCOMPARE(scene.recorder.names(), QStringList {word("actionDropped")});
     const QVariantList arguments = scene.recorder.entries().first().arguments;
     QCOMPARE(arguments.at(0).value<QToolBar*>(), scene.bar);
     QCOMPARE(arguments.at(1).toString(), word("zoom-in"));
@@ -330,7 +117,7 @@ void TestCustomToolBar::aBarDraggedOntoItselfReportsItsOwnId()
     Scene scene;
     // By its body, right of the actions.
     scene.drag(QPoint(180, 10), {QPoint(190, 100), QPoint(170, 20), QPoint(160, 20)});
-    QCOMPARE(scene.recorder.names(), QStringList{word("toolBarDropped")});
+    QCOMPARE(scene.recorder.names(), QStringList {word("toolBarDropped")});
     QCOMPARE(scene.recorder.entries().first().arguments.first().toString(), word("tools"));
 }
 
@@ -343,7 +130,7 @@ void TestCustomToolBar::aBarDraggedOntoAnotherReportsThere()
     SignalRecorder recorder(&other);
     scene.drag(QPoint(180, 10), {QPoint(100, 70), QPoint(90, 75)});
     QCOMPARE(scene.recorder.names(), QStringList());
-    QCOMPARE(recorder.names(), QStringList{word("toolBarDropped")});
+    QCOMPARE(recorder.names(), QStringList {word("toolBarDropped")});
     QCOMPARE(recorder.entries().first().arguments.first().toString(), word("tools"));
 }
 
@@ -464,7 +251,7 @@ void TestCustomToolBar::theActionFormatGoesFirst()
     both.data.setData(word(c_ToolBar), packed(word("a bar")));
     both.enter();
     QVERIFY(both.drop(QPoint(5, 5)));
-    QCOMPARE(scene.recorder.names(), QStringList{word("actionDropped")});
+    QCOMPARE(scene.recorder.names(), QStringList {word("actionDropped")});
     QCOMPARE(scene.recorder.entries().first().arguments.at(1).toString(), word("an action"));
 }
 
@@ -595,125 +382,12 @@ void TestCustomToolBar::everyStepIsLogged()
         return lines.at(i).endsWith(QStringLiteral("[vx::CustomToolBar::%1] %2").arg(word(function), message));
     };
     const QString address = QStringLiteral("0x%1").arg(quintptr(scene.bar), 0, 16);
-    QVERIFY2(ends(0, "dragEnterEvent", word("CustomToolBar::dragEnterEvent...") + address), qPrintable(lines.at(0)));
+    QVERIFY2(
+        ends(0, "dragEnterEvent", word("CustomToolBar::dragEnterEvent...") + address), qPrintable(lines.at(0)));
     QVERIFY(ends(1, "dragMoveEvent", word("CustomToolBar::dragMoveEvent...") + address));
     QVERIFY(ends(2, "dragLeaveEvent", word("CustomToolBar::dragLeaveEvent...") + address));
     QVERIFY(ends(3, "dropEvent", word("CustomToolBar::dropped action ID: zoom")));
     QVERIFY(ends(4, "dropEvent", word("CustomToolBar::dropped toolbar ID: bar")));
-}
-
-void TestCustomToolBar::openMenu(Scene& scene, int index, const std::function<void(QMenu*)>& use)
-{
-    const QPoint at = index < 0 ? QPoint(200, 20) : scene.place(index).center();
-    bool opened = false;
-    QTimer::singleShot(10, &scene.host, [&] {
-        auto* const menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
-        opened = menu != nullptr;
-        if (menu) {
-            use(menu);
-        }
-        if (auto* const still = QApplication::activePopupWidget()) {
-            still->close();
-        }
-    });
-    QContextMenuEvent event(QContextMenuEvent::Mouse, at, scene.bar->mapToGlobal(at));
-    QApplication::sendEvent(scene.bar, &event);
-    QTest::qWait(30);
-    QCOMPARE(opened, index >= 0);
-}
-
-static void choose(QMenu* menu, const char* text)
-{
-    const QList<QAction*> all = menu->actions();
-    for (QAction* const action : all) {
-        if (action->text() == word(text)) {
-            menu->setActiveAction(action);
-            QTest::keyClick(menu, Qt::Key_Return);
-            return;
-        }
-    }
-    QFAIL("no such entry");
-}
-
-void TestCustomToolBar::theMenuIsAFixedPicture()
-{
-    Scene scene;
-    scene.bar->setToolButtonStyle(Qt::ToolButtonTextOnly);
-    QStringList entries;
-    QPoint position;
-    openMenu(scene, 1, [&](QMenu* menu) {
-        position = menu->pos();
-        const QList<QAction*> all = menu->actions();
-        for (const QAction* const action : all) {
-            entries << (action->isSeparator() ? word("-") : action->text());
-            QCOMPARE(action->isCheckable(), action->text() == word("Icons Only"));
-            QCOMPARE(action->isChecked(), action->text() == word("Icons Only"));
-        }
-    });
-    QCOMPARE(entries,
-        (QStringList{word("Icons Only"), word("Icons & Text"), word("Text Only"), word("-"), word("Small Icons"),
-            word("-"), word("Remove Item"), word("-"), word("Customize Toolbar...")}));
-    QCOMPARE(position.y(), scene.bar->mapToGlobal(scene.place(1).center()).y());
-    QVERIFY(!scene.bar->findChild<QMenu*>(QString(), Qt::FindDirectChildrenOnly));
-}
-
-void TestCustomToolBar::removeItemReportsTheAction()
-{
-    Scene scene;
-    openMenu(scene, 1, [](QMenu* menu) { choose(menu, "Remove Item"); });
-    QCOMPARE(scene.recorder.names(), QStringList{word("actionRemoved")});
-    QCOMPARE(scene.recorder.entries().first().arguments.at(0).value<QToolBar*>(), scene.bar);
-    QCOMPARE(scene.recorder.entries().first().arguments.at(1).value<QAction*>(), scene.actions.at(1));
-    QCOMPARE(scene.bar->actions(), scene.actions);
-}
-
-void TestCustomToolBar::otherEntriesReportNothing()
-{
-    Scene scene;
-    for (const char* text : {"Icons Only", "Icons & Text", "Text Only", "Small Icons"}) {
-        openMenu(scene, 0, [text](QMenu* menu) { choose(menu, text); });
-    }
-    openMenu(scene, 0, [](QMenu*) {});
-    QCOMPARE(scene.recorder.names(), QStringList());
-    QCOMPARE(scene.host.customized, 0);
-    QCOMPARE(scene.bar->toolButtonStyle(), Qt::ToolButtonIconOnly);
-}
-
-void TestCustomToolBar::customizeGoesToTheParent()
-{
-    Scene scene;
-    openMenu(scene, 2, [](QMenu* menu) { choose(menu, "Customize Toolbar..."); });
-    QCOMPARE(scene.host.customized, 1);
-    QCOMPARE(scene.recorder.names(), QStringList());
-}
-
-void TestCustomToolBar::withoutThatSlotNothingBreaks()
-{
-    Scene scene;
-    QWidget plain;
-    plain.resize(200, 60);
-    scene.bar->setParent(&plain);
-    plain.show();
-    scene.bar->show();
-    QVERIFY(QTest::qWaitForWindowExposed(&plain));
-    openMenu(scene, 0, [](QMenu* menu) { choose(menu, "Customize Toolbar..."); });
-    QCOMPARE(scene.host.customized, 0);
-    scene.bar->setParent(&scene.host);
-}
-
-void TestCustomToolBar::anEmptyPartHasNoMenuOfThisClass()
-{
-    Scene scene;
-    openMenu(scene, -1, [](QMenu*) {});
-    QCOMPARE(scene.recorder.names(), QStringList());
-}
-
-void TestCustomToolBar::theBarMayDieWhileItsMenuIsOpen()
-{
-    Scene scene;
-    const QPointer<CustomToolBar> bar(scene.bar);
-    openMenu(scene, 0, [&](QMenu*) { delete bar; });
-    QVERIFY(!bar);
 }
 
 ZELKOV_TEST_MAIN(TestCustomToolBar)

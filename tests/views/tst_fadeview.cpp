@@ -131,7 +131,8 @@ void TestFadeView::statesEventsSignals_data()
                     << edge << inLayout << state << 2 << (state == 1 ? out : outWithoutSteps) << 15 << false;
                 QTest::addRow("%s, %s, %s, fadein still", name, way, from)
                     << edge << inLayout << state << 1
-                    << (inLayout ? list("fadingIn geometryChanged fadingInFinished geometryChanged") : QStringList())
+                    << (inLayout ? list("fadingIn geometryChanged fadingInFinished geometryChanged")
+                                 : QStringList())
                     << (inLayout ? 99 : 15) << true;
                 QTest::addRow("%s, %s, %s, fadeout still", name, way, from)
                     << edge << inLayout << state << 3

@@ -46,7 +46,8 @@ void TestFadeViewInterruptions::aSecondCallTakesOver()
     scene.wait("fadingOutFinished");
     // The former movement never reports its end.
     QCOMPARE(scene.folded(),
-        list("geometryChanged fadingIn geometryChanged fadingOut geometryChanged fadingOutFinished geometryChanged"));
+        list("geometryChanged fadingIn geometryChanged fadingOut geometryChanged fadingOutFinished "
+             "geometryChanged"));
     QCOMPARE(scene.view->height(), 15);
     QVERIFY(!scene.view->isFadedIn());
     QTest::qWait(350);

@@ -8,8 +8,8 @@
 
 #include <QtCore/QElapsedTimer>
 #include <QtCore/QPointer>
-#include <QtCore/QTimer>
 #include <QtCore/QRandomGenerator>
+#include <QtCore/QTimer>
 #include <QtTest/QtTest>
 
 #include <memory>
@@ -31,8 +31,9 @@ QStringList told(const SignalRecorder& recorder)
     QStringList result;
     for (const auto& entry : recorder.entries()) {
         const QWidget* const page = entry.arguments.at(0).value<QWidget*>();
-        result << QStringLiteral("%1(%2%3)").arg(entry.name, page ? page->objectName() : word("null"),
-            entry.arguments.at(1).toBool() ? word(",animated") : QString());
+        result << QStringLiteral("%1(%2%3)")
+                      .arg(entry.name, page ? page->objectName() : word("null"),
+                          entry.arguments.at(1).toBool() ? word(",animated") : QString());
     }
     return result;
 }
@@ -138,7 +139,7 @@ void TestNavigationViewController::theFirstPageAppearsAndTheSecondSaysNothing()
     connect(&pages, &NavigationViewController::viewDidAppear, this, [&] { counts << pages.count(); });
     pages.addWidget(newPage("a"));
     QCOMPARE(told(recorder), list("viewWillAppear(a) viewDidAppear(a)"));
-    QCOMPARE(counts, (QVector<int>{0, 1}));
+    QCOMPARE(counts, (QVector<int> {0, 1}));
     pages.addWidget(newPage("b"));
     QCOMPARE(recorder.entries().size(), 2);
     QCOMPARE(pages.currentIndex(), 0);
@@ -165,9 +166,9 @@ void TestNavigationViewController::aStillChangeTellsBothPages()
     connect(&stack.pages, &NavigationViewController::viewDidDisappear, this,
         [&] { indexes << stack.pages.currentIndex(); });
     stack.pages.setCurrentIndex(2);
-    QCOMPARE(told(stack.recorder),
-        list("viewWillDisappear(a) viewWillAppear(c) viewDidDisappear(a) viewDidAppear(c)"));
-    QCOMPARE(indexes, (QVector<int>{0, 2}));
+    QCOMPARE(
+        told(stack.recorder), list("viewWillDisappear(a) viewWillAppear(c) viewDidDisappear(a) viewDidAppear(c)"));
+    QCOMPARE(indexes, (QVector<int> {0, 2}));
     QCOMPARE(stack.visible(), list("c"));
     QCOMPARE(stack.pages.animatedIndex(), -1);
 }
@@ -237,7 +238,8 @@ void TestNavigationViewController::aSlideRunsFromTheSideOfThePage()
     while (stack.recorder.count(word("viewDidAppear")) == 0) {
         QTest::qWait(5);
         if (stack.recorder.count(word("viewDidAppear")) == 0) {
-            QVERIFY2(qAbs(next->x() - old->x() - side * 300) <= 1, qPrintable(QString::number(next->x() - old->x())));
+            QVERIFY2(
+                qAbs(next->x() - old->x() - side * 300) <= 1, qPrintable(QString::number(next->x() - old->x())));
             QVERIFY(qAbs(next->x()) <= 300 && qAbs(old->x()) <= 300);
             ++steps;
         }
@@ -259,7 +261,7 @@ void TestNavigationViewController::theIndexChangesAtTheEndOnly()
     connect(&stack.pages, &NavigationViewController::viewDidDisappear, this,
         [&] { seen << stack.pages.currentIndex() << stack.pages.animatedIndex(); });
     stack.waitForEnds(1);
-    QCOMPARE(seen, (QVector<int>{2, -1}));
+    QCOMPARE(seen, (QVector<int> {2, -1}));
     QCOMPARE(stack.pages.animatedWidget(), stack.pages.widget(2));
 }
 

@@ -57,7 +57,7 @@ void TestPanelGeometry::rectanglesStandAtTheirEdge()
     QFETCH(int, neighbour);
     QFETCH(int, offset);
     QFETCH(int, height);
-    const geometry::Surroundings surroundings{edge, 400, 300, neighbour, offset};
+    const geometry::Surroundings surroundings {edge, 400, 300, neighbour, offset};
     QTEST(geometry::panelRect(surroundings, height), "rect");
     QTEST(geometry::fullRect(surroundings, 300), "full");
 }
@@ -106,9 +106,9 @@ void TestPanelGeometry::sixteenIsOpenAndFifteenIsNot()
 
 void TestPanelGeometry::rowsStackUpWithBothBars()
 {
-    QCOMPARE(geometry::rowHeights(100, 2), (QVector<int>{15, 130, 230}));
-    QCOMPARE(geometry::rowHeights(100, 0), QVector<int>{15});
-    QCOMPARE(geometry::rowHeights(0, 3), (QVector<int>{15, 30, 30, 30}));
+    QCOMPARE(geometry::rowHeights(100, 2), (QVector<int> {15, 130, 230}));
+    QCOMPARE(geometry::rowHeights(100, 0), QVector<int> {15});
+    QCOMPARE(geometry::rowHeights(0, 3), (QVector<int> {15, 30, 30, 30}));
     QVERIFY(geometry::rowHeights(INT_MAX, 2).last() > 0);
 }
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // Grips, cursors and drags as plain functions.
-#include "ZelkovUtils/LinearCoordinateSystem.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
 #include "views/RubberBandGeometry.h"
+#include "ZelkovUtils/LinearCoordinateSystem.h"
 
 #include <QtCore/QRandomGenerator>
 #include <QtTest/QtTest>
@@ -106,8 +106,8 @@ void TestRubberBandGeometry::gripsReachTheMarginToBothSides_data()
     // The rectangle is (100, 200) to (299, 349), the margin 5.
     const QVector<QPair<int, int>> columns
         = {{94, 0}, {95, 1}, {100, 1}, {105, 1}, {106, 2}, {293, 2}, {294, 4}, {299, 4}, {304, 4}, {305, 0}};
-    const QVector<QPair<int, int>> rows
-        = {{194, 0}, {195, 16}, {200, 16}, {205, 16}, {206, 32}, {343, 32}, {344, 64}, {349, 64}, {354, 64}, {355, 0}};
+    const QVector<QPair<int, int>> rows = {{194, 0}, {195, 16}, {200, 16}, {205, 16}, {206, 32}, {343, 32},
+        {344, 64}, {349, 64}, {354, 64}, {355, 0}};
     for (const auto& x : columns) {
         for (const auto& y : rows) {
             int grip = 0;
@@ -169,7 +169,8 @@ void TestRubberBandGeometry::aGripIsWhatItsBandsAddUpTo()
     QRandomGenerator random(56);
     const QVector<int> all = {0, 1, 4, 16, 17, 20, 34, 64, 65, 68};
     for (int i = 0; i < 20000; ++i) {
-        const QRect rect(random.bounded(-50, 50), random.bounded(-50, 50), random.bounded(0, 60), random.bounded(0, 60));
+        const QRect rect(
+            random.bounded(-50, 50), random.bounded(-50, 50), random.bounded(0, 60), random.bounded(0, 60));
         const QPoint point(random.bounded(-80, 130), random.bounded(-80, 130));
         const int margin = random.bounded(0, 12);
         const int grip = geometry::gripAt(rect, point, margin, 3);
@@ -209,8 +210,8 @@ void TestRubberBandGeometry::aPolygonIsGrippedAsAWhole_data()
     QTest::newRow("in a wing of a bow") << bow << QPoint(90, 50) << 34;
     QTest::newRow("between the wings") << bow << QPoint(50, 80) << 0;
     QTest::newRow("no point") << QPolygon() << QPoint() << 0;
-    QTest::newRow("one point") << QPolygon(QVector<QPoint>{QPoint(5, 5)}) << QPoint(5, 5) << 0;
-    QTest::newRow("two points") << QPolygon(QVector<QPoint>{QPoint(0, 0), QPoint(10, 0)}) << QPoint(5, 0) << 0;
+    QTest::newRow("one point") << QPolygon(QVector<QPoint> {QPoint(5, 5)}) << QPoint(5, 5) << 0;
+    QTest::newRow("two points") << QPolygon(QVector<QPoint> {QPoint(0, 0), QPoint(10, 0)}) << QPoint(5, 0) << 0;
 }
 
 void TestRubberBandGeometry::aPolygonIsGrippedAsAWhole()
@@ -272,22 +273,28 @@ void TestRubberBandGeometry::aDragAsksTheSystemForItsSides_data()
     const QString adjust = QStringLiteral("adjust 1.5 33 100");
     const QString map = QStringLiteral("map");
     QTest::newRow("none") << 0 << QStringList() << QRect(10, 20, 100, 50);
-    QTest::newRow("left") << 1 << QStringList{QStringLiteral("left 13"), adjust, map} << QRect(13, 20, 97, 50);
-    QTest::newRow("right") << 4 << QStringList{QStringLiteral("right 112"), adjust, map} << QRect(10, 20, 103, 50);
-    QTest::newRow("top") << 16 << QStringList{QStringLiteral("top 27"), adjust, map} << QRect(10, 27, 100, 43);
-    QTest::newRow("bottom") << 64 << QStringList{QStringLiteral("bottom 76"), adjust, map} << QRect(10, 20, 100, 57);
-    QTest::newRow("top left") << 17 << QStringList{QStringLiteral("left 13"), QStringLiteral("top 27"), adjust, map}
+    QTest::newRow("left") << 1 << QStringList {QStringLiteral("left 13"), adjust, map} << QRect(13, 20, 97, 50);
+    QTest::newRow("right") << 4 << QStringList {QStringLiteral("right 112"), adjust, map}
+                           << QRect(10, 20, 103, 50);
+    QTest::newRow("top") << 16 << QStringList {QStringLiteral("top 27"), adjust, map} << QRect(10, 27, 100, 43);
+    QTest::newRow("bottom") << 64 << QStringList {QStringLiteral("bottom 76"), adjust, map}
+                            << QRect(10, 20, 100, 57);
+    QTest::newRow("top left") << 17
+                              << QStringList {QStringLiteral("left 13"), QStringLiteral("top 27"), adjust, map}
                               << QRect(13, 27, 97, 43);
-    QTest::newRow("top right") << 20 << QStringList{QStringLiteral("right 112"), QStringLiteral("top 27"), adjust, map}
+    QTest::newRow("top right") << 20
+                               << QStringList {QStringLiteral("right 112"), QStringLiteral("top 27"), adjust, map}
                                << QRect(10, 27, 103, 43);
     QTest::newRow("bottom left") << 65
-                                 << QStringList{QStringLiteral("left 13"), QStringLiteral("bottom 76"), adjust, map}
+                                 << QStringList {QStringLiteral("left 13"), QStringLiteral("bottom 76"), adjust,
+                                        map}
                                  << QRect(13, 20, 97, 57);
     QTest::newRow("bottom right") << 68
-                                  << QStringList{QStringLiteral("right 112"), QStringLiteral("bottom 76"), adjust, map}
+                                  << QStringList {QStringLiteral("right 112"), QStringLiteral("bottom 76"), adjust,
+                                         map}
                                   << QRect(10, 20, 103, 57);
-    QTest::newRow("inside") << 34 << QStringList{QStringLiteral("move 3 7 33"), map} << QRect(13, 27, 100, 50);
-    QTest::newRow("no grip") << 85 << QStringList{map} << QRect(10, 20, 100, 50);
+    QTest::newRow("inside") << 34 << QStringList {QStringLiteral("move 3 7 33"), map} << QRect(13, 27, 100, 50);
+    QTest::newRow("no grip") << 85 << QStringList {map} << QRect(10, 20, 100, 50);
 }
 
 void TestRubberBandGeometry::aDragAsksTheSystemForItsSides()
@@ -370,14 +377,16 @@ void TestRubberBandGeometry::proportionsStayInARandomDrag()
     QRandomGenerator random(58);
     const QVector<int> grips = {1, 4, 16, 17, 20, 64, 65, 68};
     for (int i = 0; i < 5000; ++i) {
-        const QRectF original(random.bounded(500), random.bounded(200), random.bounded(20, 300), random.bounded(20, 200));
+        const QRectF original(
+            random.bounded(500), random.bounded(200), random.bounded(20, 300), random.bounded(20, 200));
         QRect screen = system.mapToScreen(original);
         QRectF units = original;
         const QPoint offset(random.bounded(-40, 40), random.bounded(-40, 40));
         geometry::drag(system, grips.at(random.bounded(grips.size())), screen, units, c_Calc, offset, original);
         if (units.height() > 1e-6) {
             const double before = original.width() / original.height();
-            QVERIFY2(qAbs(units.width() / units.height() - before) < 1e-6 * before, qPrintable(QString::number(i)));
+            QVERIFY2(
+                qAbs(units.width() / units.height() - before) < 1e-6 * before, qPrintable(QString::number(i)));
         }
     }
 }

@@ -1,106 +1,20 @@
 // SPDX-License-Identifier: MIT
-// The rubber band: its geometry, its drags, its signals and its looks.
-#include "ZelkovUtils/LinearCoordinateSystem.h"
-#include "support/Pointer.h"
-#include "support/SignalRecorder.h"
-#include "support/TestCase.h"
+// The rubber band: its geometry, its signals and its looks.
+#include "BandScene.h"
 #include "support/TestMain.h"
-#include "views/RubberBandWidget.h"
 
-#include <QtCore/QPointer>
-#include <QtGui/QMouseEvent>
-#include <QtTest/QtTest>
-#include <QtWidgets/QApplication>
-#include <QtWidgets/QGridLayout>
-#include <QtWidgets/QLabel>
-#include <QtWidgets/QPushButton>
-
-#include <limits>
+using bandscene::c_BottomRight;
+using bandscene::c_Inside;
+using bandscene::OpenBand;
+using bandscene::Scene;
+using bandscene::word;
 
 using vx::CoordinateSystem;
 using vx::RubberBandWidget;
 using zelkovtest::SignalRecorder;
 
-namespace
-{
-QString word(const char* text)
-{
-    return QString::fromLatin1(text);
-}
-
-/// Lets a test call what is protected and see which of the virtual functions were asked.
-class OpenBand : public RubberBandWidget
-{
-public:
-    using RubberBandWidget::RubberBandWidget;
-    using RubberBandWidget::calcDrag;
-
-    void setContentsGeometry(const QRect& rect) override
-    {
-        asked << word("setContentsGeometry");
-        RubberBandWidget::setContentsGeometry(rect);
-    }
-    void startDragging(QPoint position, Grip grip) override
-    {
-        asked << word("startDragging");
-        RubberBandWidget::startDragging(position, grip);
-    }
-    QStringList asked;
-
-protected:
-    void drawFrame(QPainter* painter) override
-    {
-        asked << word("drawFrame");
-        RubberBandWidget::drawFrame(painter);
-    }
-    void drawContents(QPainter* painter) override
-    {
-        asked << word("drawContents");
-        RubberBandWidget::drawContents(painter);
-    }
-};
-
-/// A view of 500 by 250 pixels that shows 1000 by 500 units, and a band over (100, 50) to (199, 124) pixels.
-struct Scene
-{
-    Scene()
-        : system(QRectF(0, 0, 1000, 500), &view)
-    {
-        view.resize(500, 250);
-        view.setFocusPolicy(Qt::StrongFocus);
-        view.setFocus();
-        band = new OpenBand(&system, &view);
-        band->setApplicationGeometry(QRectF(200, 100, 200, 150));
-        view.show();
-        (void)QTest::qWaitForWindowExposed(&view);
-        band->asked.clear();
-    }
-
-    void send(QEvent::Type type, const QPoint& inView, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
-        Qt::MouseButton button = Qt::LeftButton)
-    {
-        const bool isMove = type == QEvent::MouseMove;
-        const Qt::MouseButtons buttons = type == QEvent::MouseButtonRelease ? Qt::NoButton : button;
-        QMouseEvent event(type, band->mapFrom(&view, inView), view.mapToGlobal(inView),
-            isMove ? Qt::NoButton : button, buttons, modifiers);
-        QApplication::sendEvent(band, &event);
-    }
-
-    void drag(const QPoint& from, const QPoint& to, Qt::KeyboardModifiers modifiers = Qt::NoModifier)
-    {
-        send(QEvent::MouseButtonPress, from, modifiers);
-        send(QEvent::MouseMove, to, modifiers);
-        send(QEvent::MouseButtonRelease, to, modifiers);
-    }
-
-    QWidget view;
-    vx::LinearCoordinateSystem system;
-    OpenBand* band;
-};
-
-const QPoint c_Inside(150, 90);
-const QPoint c_BottomRight(199, 124);
-}
+// Before anything names the type.
+static const int s_typeAtStart = QMetaType::type("vx::RubberBandWidget*");
 
 class TestRubberBandWidget : public zelkovtest::TestCase
 {
@@ -115,35 +29,14 @@ private Q_SLOTS:
     void aRatioIsKeptUntilAnotherIsSet();
     void anotherSystemShowsTheBandAnew();
     void withoutASystemNothingIsShownAnew();
-
     void theWidgetsGripCountsItsMarginAndItsPen_data();
     void theWidgetsGripCountsItsMarginAndItsPen();
-    void hoveringFindsTheGripAndItsCursor_data();
-    void hoveringFindsTheGripAndItsCursor();
-    void resizeDraggingIsAnyEdgeButNotTheInside();
-
-    void aDragEmitsStartEveryMoveAndEnd();
-    void aPressWithoutAMoveIsADragToo();
-    void everyGripDragsItsSides_data();
-    void everyGripDragsItsSides();
-    void aDragIsMeasuredFromThePress();
-    void aFlippedBandComesBackAsItWas();
-    void shiftKeepsTheProportions();
-    void shiftCanBeTakenInMidDrag();
-    void aStoredRatioMakesShiftMeaningless();
-    void theCalculatedRatioCanBeStored();
-    void aDragFromTheProgramIsLikeAPress();
-    void gripZeroMovesNothingAndStillReports();
-    void thePressRaisesTheBand();
-    void aLeaveForgetsTheGrip();
-
     void enterAndLeaveAreReported();
     void focusRaisesAndIsReported();
     void selectingReportsChangesOnly();
     void theCloseButtonReportsAndDoesNothing();
     void anEmptyLabelIsHidden();
     void theLabelDoesNotStandInTheWay();
-
     void theFrameIsDrawnInsideTheMarkedArea();
     void theFrameOfASelectedBandIsTwiceAsWide();
     void contentsComeBeforeTheFrame();
@@ -155,9 +48,6 @@ private Q_SLOTS:
     void aSlotMayDeleteTheBandAtAnyTime();
     void clientsMayQueueTheSignals();
 };
-
-// Before anything names the type.
-static const int s_typeAtStart = QMetaType::type("vx::RubberBandWidget*");
 
 void TestRubberBandWidget::theMetaTypeIsKnownFromTheStart()
 {
@@ -230,7 +120,7 @@ void TestRubberBandWidget::theApplicationGeometryIsShownThroughTheSystem()
     QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 100, 75));
     scene.band->setApplicationGeometry(QRectF(0, 0, 1000, 500));
     QCOMPARE(scene.band->contentsGeometry(), QRect(0, 0, 500, 250));
-    QCOMPARE(scene.band->asked, QStringList{word("setContentsGeometry")});
+    QCOMPARE(scene.band->asked, QStringList {word("setContentsGeometry")});
     QCOMPARE(scene.band->applicationGeometry(), QRectF(0, 0, 1000, 500));
 }
 
@@ -298,230 +188,15 @@ void TestRubberBandWidget::theWidgetsGripCountsItsMarginAndItsPen()
     QTEST(int(scene.band->findGrip(point)), "grip");
 }
 
-void TestRubberBandWidget::hoveringFindsTheGripAndItsCursor_data()
-{
-    QTest::addColumn<QPoint>("point");
-    QTest::addColumn<int>("cursor");
-    QTest::addColumn<bool>("resizes");
-    QTest::newRow("left") << QPoint(100, 90) << int(Qt::SizeHorCursor) << true;
-    QTest::newRow("top") << QPoint(150, 50) << int(Qt::SizeVerCursor) << true;
-    QTest::newRow("bottom right") << c_BottomRight << int(Qt::SizeFDiagCursor) << true;
-    QTest::newRow("bottom left") << QPoint(100, 124) << int(Qt::SizeBDiagCursor) << true;
-    QTest::newRow("inside") << c_Inside << int(Qt::OpenHandCursor) << false;
-}
-
-void TestRubberBandWidget::hoveringFindsTheGripAndItsCursor()
-{
-    QFETCH(QPoint, point);
-    Scene scene;
-    SignalRecorder recorder(scene.band);
-    scene.send(QEvent::MouseMove, point, Qt::NoModifier, Qt::NoButton);
-    QTEST(int(scene.band->cursor().shape()), "cursor");
-    QTEST(scene.band->isResizeDragging(), "resizes");
-    QCOMPARE(recorder.names(), QStringList());
-}
-
-void TestRubberBandWidget::resizeDraggingIsAnyEdgeButNotTheInside()
-{
-    Scene scene;
-    for (const int grip : {1, 4, 16, 17, 20, 64, 65, 68}) {
-        scene.band->startDragging(QPoint(5, 5), RubberBandWidget::Grip(grip));
-        QVERIFY(scene.band->isResizeDragging());
-    }
-    for (const int grip : {0, 34}) {
-        scene.band->startDragging(QPoint(5, 5), RubberBandWidget::Grip(grip));
-        QVERIFY(!scene.band->isResizeDragging());
-    }
-}
-
-void TestRubberBandWidget::aDragEmitsStartEveryMoveAndEnd()
-{
-    Scene scene;
-    zelkovtest::Pointer pointer(&scene.view);
-    pointer.move(c_Inside);
-    SignalRecorder recorder(scene.band);
-    pointer.press();
-    QCOMPARE(recorder.names(), (QStringList{word("focused"), word("startDrag")}));
-    QCOMPARE(scene.band->cursor().shape(), Qt::ClosedHandCursor);
-    recorder.clear();
-    pointer.move(c_Inside + QPoint(10, 5));
-    pointer.move(c_Inside + QPoint(20, 15));
-    QCOMPARE(recorder.names(), (QStringList{word("dragging"), word("dragging")}));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(120, 65, 100, 75));
-    QCOMPARE(scene.band->applicationGeometry(), QRectF(240, 130, 200, 150));
-    recorder.clear();
-    pointer.release();
-    QCOMPARE(recorder.names(), QStringList{word("endDrag")});
-    QCOMPARE(recorder.entries().first().arguments.first().value<RubberBandWidget*>(), scene.band);
-    QCOMPARE(scene.band->cursor().shape(), Qt::OpenHandCursor);
-    // The drag is over: a further move is hovering.
-    recorder.clear();
-    pointer.move(c_Inside + QPoint(25, 15));
-    QCOMPARE(recorder.names(), QStringList());
-    QCOMPARE(scene.band->contentsGeometry(), QRect(120, 65, 100, 75));
-}
-
-void TestRubberBandWidget::aPressWithoutAMoveIsADragToo()
-{
-    Scene scene;
-    SignalRecorder recorder(scene.band);
-    scene.send(QEvent::MouseButtonPress, c_Inside, Qt::NoModifier, Qt::RightButton);
-    scene.send(QEvent::MouseButtonRelease, c_Inside, Qt::NoModifier, Qt::RightButton);
-    QCOMPARE(recorder.names(), (QStringList{word("startDrag"), word("endDrag")}));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 100, 75));
-}
-
-void TestRubberBandWidget::everyGripDragsItsSides_data()
-{
-    QTest::addColumn<QPoint>("press");
-    QTest::addColumn<QRect>("result");
-    QTest::newRow("left") << QPoint(100, 90) << QRect(110, 50, 90, 75);
-    QTest::newRow("right") << QPoint(199, 90) << QRect(100, 50, 110, 75);
-    QTest::newRow("top") << QPoint(150, 50) << QRect(100, 56, 100, 69);
-    QTest::newRow("bottom") << QPoint(150, 124) << QRect(100, 50, 100, 81);
-    QTest::newRow("top left") << QPoint(100, 50) << QRect(110, 56, 90, 69);
-    QTest::newRow("top right") << QPoint(199, 50) << QRect(100, 56, 110, 69);
-    QTest::newRow("bottom left") << QPoint(100, 124) << QRect(110, 50, 90, 81);
-    QTest::newRow("bottom right") << c_BottomRight << QRect(100, 50, 110, 81);
-    QTest::newRow("inside") << c_Inside << QRect(110, 56, 100, 75);
-    // Not on the edge, but within its reach: the edge does not jump to the pointer.
-    QTest::newRow("beside the right edge") << QPoint(202, 90) << QRect(100, 50, 110, 75);
-}
-
-void TestRubberBandWidget::everyGripDragsItsSides()
-{
-    QFETCH(QPoint, press);
-    QFETCH(QRect, result);
-    Scene scene;
-    scene.drag(press, press + QPoint(10, 6));
-    QCOMPARE(scene.band->contentsGeometry(), result);
-    const QRectF units(result.x() * 2, result.y() * 2, result.width() * 2, result.height() * 2);
-    QCOMPARE(scene.band->applicationGeometry(), units);
-}
-
-void TestRubberBandWidget::aDragIsMeasuredFromThePress()
-{
-    Scene scene;
-    // A scale that does not divide: 500 pixels show 333 units.
-    scene.system.setApplicationRect(QRectF(0, 0, 333, 777));
-    const QRectF before(50.3, 60.7, 100.1, 200.9);
-    scene.band->setApplicationGeometry(before);
-    const QPoint centre = scene.band->contentsGeometry().center();
-    scene.send(QEvent::MouseButtonPress, centre);
-    for (int i = 0; i < 500; ++i) {
-        scene.send(QEvent::MouseMove, centre + QPoint((i * 37) % 101 - 50, (i * 53) % 67 - 30));
-    }
-    scene.send(QEvent::MouseMove, centre);
-    scene.send(QEvent::MouseButtonRelease, centre);
-    QCOMPARE(scene.band->applicationGeometry(), before);
-}
-
-void TestRubberBandWidget::aFlippedBandComesBackAsItWas()
-{
-    Scene scene;
-    scene.send(QEvent::MouseButtonPress, c_BottomRight);
-    scene.send(QEvent::MouseMove, c_BottomRight - QPoint(150, 100));
-    QCOMPARE(scene.band->applicationGeometry(), QRectF(100, 50, 100, 50));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(50, 25, 50, 25));
-    scene.send(QEvent::MouseMove, c_BottomRight);
-    scene.send(QEvent::MouseButtonRelease, c_BottomRight);
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 100, 75));
-}
-
-void TestRubberBandWidget::shiftKeepsTheProportions()
-{
-    Scene scene;
-    scene.drag(c_BottomRight, c_BottomRight + QPoint(100, 5), Qt::ShiftModifier);
-    // 200 x 150 units, the width doubled.
-    QCOMPARE(scene.band->applicationGeometry(), QRectF(200, 100, 400, 300));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 200, 150));
-}
-
-void TestRubberBandWidget::shiftCanBeTakenInMidDrag()
-{
-    Scene scene;
-    scene.send(QEvent::MouseButtonPress, c_BottomRight);
-    scene.send(QEvent::MouseMove, c_BottomRight + QPoint(100, 5), Qt::ShiftModifier);
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 200, 150));
-    scene.send(QEvent::MouseMove, c_BottomRight + QPoint(100, 5));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 200, 80));
-    scene.send(QEvent::MouseButtonRelease, c_BottomRight + QPoint(100, 5));
-}
-
-void TestRubberBandWidget::aStoredRatioMakesShiftMeaningless()
-{
-    for (const auto modifiers : {Qt::NoModifier, Qt::ShiftModifier}) {
-        Scene scene;
-        scene.band->setAspectRatio(1.0);
-        scene.drag(c_BottomRight, c_BottomRight + QPoint(100, 5), modifiers);
-        QCOMPARE(scene.band->applicationGeometry(), QRectF(200, 100, 400, 400));
-    }
-}
-
-void TestRubberBandWidget::theCalculatedRatioCanBeStored()
-{
-    Scene scene;
-    scene.band->setAspectRatio(CoordinateSystem::CALC_ASPECT_RATIO);
-    scene.drag(c_BottomRight, c_BottomRight + QPoint(100, 5));
-    QCOMPARE(scene.band->applicationGeometry(), QRectF(200, 100, 400, 300));
-}
-
-void TestRubberBandWidget::aDragFromTheProgramIsLikeAPress()
-{
-    Scene scene;
-    scene.band->setApplicationGeometry(QRectF(20, 20, 2, 2));
-    SignalRecorder recorder(scene.band);
-    scene.band->startDragging(scene.view.mapToGlobal(QPoint(10, 10)), RubberBandWidget::gBottomRight);
-    scene.send(QEvent::MouseMove, QPoint(60, 40));
-    scene.send(QEvent::MouseButtonRelease, QPoint(60, 40));
-    QCOMPARE(recorder.names(), (QStringList{word("startDrag"), word("dragging"), word("endDrag")}));
-    QCOMPARE(scene.band->contentsGeometry(), QRect(10, 10, 51, 31));
-}
-
-void TestRubberBandWidget::gripZeroMovesNothingAndStillReports()
-{
-    Scene scene;
-    SignalRecorder recorder(scene.band);
-    scene.band->startDragging(scene.view.mapToGlobal(c_Inside), RubberBandWidget::gNone);
-    scene.band->asked.clear();
-    scene.send(QEvent::MouseMove, c_Inside + QPoint(30, 30));
-    QCOMPARE(recorder.names(), (QStringList{word("startDrag"), word("dragging")}));
-    QCOMPARE(scene.band->asked, QStringList{word("setContentsGeometry")});
-    QCOMPARE(scene.band->contentsGeometry(), QRect(100, 50, 100, 75));
-    scene.send(QEvent::MouseButtonRelease, c_Inside);
-}
-
-void TestRubberBandWidget::thePressRaisesTheBand()
-{
-    Scene scene;
-    auto* other = new QWidget(&scene.view);
-    other->show();
-    QVERIFY(scene.view.children().last() == other);
-    scene.send(QEvent::MouseButtonPress, c_Inside);
-    QVERIFY(scene.view.children().last() == scene.band);
-    scene.send(QEvent::MouseButtonRelease, c_Inside);
-}
-
-void TestRubberBandWidget::aLeaveForgetsTheGrip()
-{
-    Scene scene;
-    scene.send(QEvent::MouseMove, c_BottomRight, Qt::NoModifier, Qt::NoButton);
-    QVERIFY(scene.band->isResizeDragging());
-    QEvent leave(QEvent::Leave);
-    QApplication::sendEvent(scene.band, &leave);
-    QVERIFY(!scene.band->isResizeDragging());
-    QCOMPARE(scene.band->cursor().shape(), Qt::OpenHandCursor);
-}
-
 void TestRubberBandWidget::enterAndLeaveAreReported()
 {
     Scene scene;
     zelkovtest::Pointer pointer(&scene.view);
     SignalRecorder recorder(scene.band);
     pointer.move(c_Inside);
-    QCOMPARE(recorder.names(), QStringList{word("mouseEntered")});
+    QCOMPARE(recorder.names(), QStringList {word("mouseEntered")});
     pointer.move(QPoint(10, 10));
-    QCOMPARE(recorder.names(), (QStringList{word("mouseEntered"), word("mouseLeft")}));
+    QCOMPARE(recorder.names(), (QStringList {word("mouseEntered"), word("mouseLeft")}));
 }
 
 void TestRubberBandWidget::focusRaisesAndIsReported()
@@ -533,10 +208,10 @@ void TestRubberBandWidget::focusRaisesAndIsReported()
     QApplication::setActiveWindow(&scene.view);
     SignalRecorder recorder(scene.band);
     scene.band->setFocus();
-    QCOMPARE(recorder.names(), QStringList{word("focused")});
+    QCOMPARE(recorder.names(), QStringList {word("focused")});
     QVERIFY(scene.view.children().last() == scene.band);
     other->setFocus();
-    QCOMPARE(recorder.names(), (QStringList{word("focused"), word("focusLost")}));
+    QCOMPARE(recorder.names(), (QStringList {word("focused"), word("focusLost")}));
 }
 
 void TestRubberBandWidget::selectingReportsChangesOnly()
@@ -548,10 +223,10 @@ void TestRubberBandWidget::selectingReportsChangesOnly()
     scene.band->select(true);
     scene.band->select(true);
     QVERIFY(scene.band->isSelected());
-    QCOMPARE(recorder.names(), QStringList{word("selected")});
+    QCOMPARE(recorder.names(), QStringList {word("selected")});
     scene.band->select(false);
     scene.band->select(false);
-    QCOMPARE(recorder.names(), (QStringList{word("selected"), word("selectionLost")}));
+    QCOMPARE(recorder.names(), (QStringList {word("selected"), word("selectionLost")}));
 }
 
 void TestRubberBandWidget::theCloseButtonReportsAndDoesNothing()
@@ -642,7 +317,7 @@ void TestRubberBandWidget::contentsComeBeforeTheFrame()
     QCoreApplication::processEvents();
     scene.band->asked.clear();
     scene.band->repaint();
-    QCOMPARE(scene.band->asked, (QStringList{word("drawContents"), word("drawFrame")}));
+    QCOMPARE(scene.band->asked, (QStringList {word("drawContents"), word("drawFrame")}));
 }
 
 void TestRubberBandWidget::theTransparencyIsCutToAWholeAlpha_data()
@@ -744,7 +419,8 @@ void TestRubberBandWidget::clientsMayQueueTheSignals()
 {
     Scene scene;
     RubberBandWidget* seen = nullptr;
-    connect(scene.band, &RubberBandWidget::selected, this, [&](RubberBandWidget* band) { seen = band; },
+    connect(
+        scene.band, &RubberBandWidget::selected, this, [&](RubberBandWidget* band) { seen = band; },
         Qt::QueuedConnection);
     scene.band->select(true);
     QVERIFY(!seen);

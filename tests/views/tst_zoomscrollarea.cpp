@@ -83,6 +83,10 @@ struct Scene
         return nullptr;
     }
 
+    /// Lets the stop wait: on a busy machine a time line may end after it.
+    void holdStop() { timer(825)->start(60000); }
+    void stop() { QMetaObject::invokeMethod(&area, "stopAllZooming", Qt::DirectConnection); }
+
     bool touch(QEvent::Type type)
     {
         QTouchEvent event(type);
@@ -260,13 +264,14 @@ void TestZoomScrollArea::aNotchGivesTicksAndAStop()
     QVERIFY(scene.timer(825)->isActive());
     QTRY_VERIFY_WITH_TIMEOUT(!scene.timer(825)->isActive(), 5000);
     QVERIFY2(clock.elapsed() >= 800, qPrintable(QString::number(clock.elapsed())));
-    QVector<double> factors = scene.factors();
+    const QVector<double> factors = scene.factors();
     QVERIFY2(factors.size() >= 4 && factors.size() <= 13, qPrintable(QString::number(factors.size())));
     // Full speed on each tick; the end of the time line takes the step, and then the stream stops.
-    QCOMPARE(factors.takeLast(), 0.0);
-    QCOMPARE(factors.takeLast(), 0.0);
-    QVERIFY(isAll(factors, 1.0));
-    QCOMPARE(scene.timeLines(), 0);
+    const int moving = factors.indexOf(0.0);
+    QVERIFY(moving >= 3);
+    QVERIFY(isAll(factors.mid(0, moving), 1.0));
+    QVERIFY(isAll(factors.mid(moving), 0.0));
+    QTRY_COMPARE(scene.timeLines(), 0);
     const int before = scene.factors().size();
     QTest::qWait(200);
     QCOMPARE(scene.factors().size(), before);
@@ -299,13 +304,15 @@ void TestZoomScrollArea::lessThanANotchStillTicks()
     scene.wheel(119);
     QCOMPARE(scene.timeLines(), 1);
     QVERIFY(scene.timer(825)->isActive());
+    scene.holdStop();
     QTRY_COMPARE_WITH_TIMEOUT(scene.timeLines(), 0, 5000);
     QVector<double> factors = scene.factors();
     // No step is owed, so the ticks say 0, but the end of the time line turns 0 into a step.
     QCOMPARE(factors.takeLast(), 1.0);
     QVERIFY(factors.size() >= 3);
     QVERIFY(isAll(factors, 0.0));
-    QTRY_COMPARE(scene.factors().last(), 0.0);
+    scene.stop();
+    QCOMPARE(scene.factors().last(), 0.0);
 }
 
 void TestZoomScrollArea::zoomingOutGivesMinusOne()
@@ -379,10 +386,12 @@ void TestZoomScrollArea::severalNotchesAreTakenOneByOne()
 {
     Scene scene;
     scene.wheel(240);
+    scene.holdStop();
     // The one time line takes one of two steps: the factor stays until the timer stops it.
     QTRY_COMPARE_WITH_TIMEOUT(scene.timeLines(), 0, 5000);
     QCOMPARE(scene.factors().last(), 1.0);
-    QTRY_COMPARE(scene.factors().last(), 0.0);
+    scene.stop();
+    QCOMPARE(scene.factors().last(), 0.0);
     QCOMPARE(scene.factors().count(0.0), 1);
 }
 
@@ -394,7 +403,7 @@ void TestZoomScrollArea::scrollingIsReported()
     scene.area.verticalScrollBar()->setValue(40);
     // After the content has moved.
     QCOMPARE(seen, 40);
-    QCOMPARE(scene.recorder.names(), QStringList{QStringLiteral("scrollAreaChanged")});
+    QCOMPARE(scene.recorder.names(), QStringList {QStringLiteral("scrollAreaChanged")});
 }
 
 void TestZoomScrollArea::touchesAreNotedAndGoNoFurther()
@@ -461,7 +470,7 @@ void TestZoomScrollArea::slotsMayDeleteTheArea_data()
     QTest::addColumn<int>("angle");
     QTest::newRow("on a tick") << 1.0 << 120;
     QTest::newRow("at the end of the time line") << 0.0 << 120;
-    QTest::newRow("at the end, after less than a notch") << 1.0 << 60;
+    QTest::newRow("at the end, after less than a notch") << 1.0 << 60; // 0 becomes 1
     QTest::newRow("at the stop") << 0.0 << 240;
 }
 
@@ -481,6 +490,14 @@ void TestZoomScrollArea::slotsMayDeleteTheArea()
     QWheelEvent event(QPointF(10, 10), QPointF(10, 10), QPoint(), QPoint(0, angle), Qt::NoButton, Qt::NoModifier,
         Qt::NoScrollPhase, false);
     QApplication::sendEvent(area->viewport(), &event);
+    if (angle == 60) {
+        const auto timers = area->findChildren<QTimer*>(QString(), Qt::FindDirectChildrenOnly);
+        for (QTimer* const timer : timers) {
+            if (timer->interval() == 825) {
+                timer->start(60000);
+            }
+        }
+    }
     QTRY_VERIFY_WITH_TIMEOUT(!alive, 5000);
 }
 
