@@ -524,9 +524,9 @@ void TestNavigationViewController::aSlideshowMovesOnByItself()
     QElapsedTimer clock;
     clock.start();
     auto* const timer = show.findChild<QTimer*>(QString(), Qt::FindDirectChildrenOnly);
+    // Once, and sooner.
+    timer->setSingleShot(true);
     timer->start(50);
-    QTRY_COMPARE(recorder.count(word("viewWillAppear")), 1);
-    timer->stop();
     QTRY_COMPARE(show.currentIndex(), 1);
     QVERIFY2(clock.elapsed() >= 790, qPrintable(QString::number(clock.elapsed())));
     QCOMPARE(told(recorder),
