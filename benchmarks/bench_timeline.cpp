@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the time line costs: the rule by which handles share a scale, laying out a thousand of them, one step of a drag.
-// Each beside its floor, measured in turns; the figure that counts is the ratio.
+// What the time line costs: the rule by which handles share a scale, laying out a thousand of them, one step of a
+// drag. Each beside its floor, measured in turns; the figure that counts is the ratio.
 #include "sliders/MultiNubsieSlider.h"
 #include "sliders/NubsieLayout.h"
 
@@ -27,21 +27,21 @@ double median(std::vector<double> values)
 
 double cpuSeconds()
 {
-    timespec now{};
+    timespec now {};
     clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
     return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
 }
 
 // Of this process, so that a busy machine does not count.
-template<typename Work>
-double seconds(const Work& work)
+template <typename Work> double seconds(const Work& work)
 {
     const double start = cpuSeconds();
     work();
     return cpuSeconds() - start;
 }
 
-void report(benchmark::State& state, const std::vector<double>& ours, const std::vector<double>& floor, double scale = 1.0)
+void report(
+    benchmark::State& state, const std::vector<double>& ours, const std::vector<double>& floor, double scale = 1.0)
 {
     state.counters["ours_us"] = median(ours) * scale * 1e6;
     state.counters["floor_us"] = median(floor) * scale * 1e6;

@@ -147,8 +147,7 @@ protected:
         font.setPixelSize(14);
         font.setBold(true);
         p.setFont(font);
-        const QString texts[]
-            = {QStringLiteral("Road 4"), QStringLiteral("2026-03-14  ") + clock(m_seconds)};
+        const QString texts[] = {QStringLiteral("Road 4"), QStringLiteral("2026-03-14  ") + clock(m_seconds)};
         const int places[] = {Qt::AlignLeft | Qt::AlignTop, Qt::AlignRight | Qt::AlignTop};
         for (int i = 0; i < 2; ++i) {
             p.setPen(QColor(0, 0, 0, 180));
@@ -205,9 +204,10 @@ QWidget* TimeLinePage::makeDay()
     m_recording = new RecordingView;
     m_moment = label(QString(), "title");
     m_range = label(QString());
-    auto* hint = label(tr("Drag the blue handle through the day. The farther you pull away from the bar, the slower it "
-                          "goes, down to single seconds. The flags go with the ends of the range."),
-        "hint");
+    auto* hint
+        = label(tr("Drag the blue handle through the day. The farther you pull away from the bar, the slower it "
+                   "goes, down to single seconds. The flags go with the ends of the range."),
+            "hint");
     hint->setWordWrap(true);
     auto* words = new QVBoxLayout;
     words->setSpacing(8);
@@ -447,9 +447,8 @@ void TimeLinePage::placeFlags()
     }
     const int size = m_day->height() / 2;
     const int way = m_day->width() - s_dayHandle;
-    const auto pole = [&](int id) {
-        return s_dayHandle / 2 + int(double(way) * m_day->value(id) / s_secondsOfDay);
-    };
+    const auto pole
+        = [&](int id) { return s_dayHandle / 2 + int(double(way) * m_day->value(id) / s_secondsOfDay); };
     m_day->getFirstFlag()->setGeometry(pole(hStart) - size * 15 / 100, 0, size, size);
     m_day->getSecondFlag()->setGeometry(pole(hEnd) - size * 85 / 100, 0, size, size);
 }

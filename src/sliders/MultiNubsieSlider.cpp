@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
-// A slider with any number of handles on one scale: its handles, their layout, and what it does as a widget.
-// MultiNubsieSliderHandles.cpp has the operations by id, MultiNubsieSliderInteraction.cpp the mouse.
+// A slider with any number of handles on one scale: its handles and their layout. Other files have the operations
+// by id (Handles), the mouse (Interaction), what it does as a widget (Widget), what it paints (Painting), and the
+// flags.
 #include "sliders/MultiNubsieSlider.h"
 
 #include "CoreQt/Connect.h"
@@ -8,9 +9,6 @@
 #include "sliders/NubsieLayout.h"
 #include "sliders/SliderDecoration.h"
 
-#include <QtCore/QEvent>
-#include <QtGui/QMoveEvent>
-#include <QtGui/QResizeEvent>
 #include <QtWidgets/QApplication>
 
 #include <algorithm>
@@ -21,8 +19,6 @@ namespace vx
 namespace
 {
 constexpr int c_LongClickTime = 1500; // ms
-constexpr int c_FadeInTime = 500; // ms
-constexpr int c_FadeOutTime = 2000; // ms
 
 int middleOf(int minimum, int maximum)
 {
@@ -33,8 +29,8 @@ int middleOf(int minimum, int maximum)
 QPixmap shrunkFlagPicture(const QPixmap& picture)
 {
     return picture.isNull() ? picture
-                            : picture.scaled(SliderDecoration::shrunkFlagSize(picture.size()), Qt::IgnoreAspectRatio,
-                                  Qt::SmoothTransformation);
+                            : picture.scaled(SliderDecoration::shrunkFlagSize(picture.size()),
+                                Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
 }
 
 int lengthAlong(const QSize& size, Qt::Orientation orientation)
@@ -101,8 +97,8 @@ MultiNubsieSlider::MultiNubsieSlider(QWidget* parent, QWidget* window)
 {
     vx::connect(&m_opacityAnimator, "2valueChanged( const QVariant & )", this, "1update()", Qt::AutoConnection);
     vx::connect(this, "2nubsieValueChanged(vx::NubsieID,int)", this, "1setActiveOpacity()", Qt::AutoConnection);
-    vx::connect(this, "2triggerNubsieRepaintQueued(bool)", this, "1updateNubsiePositions(bool)",
-        Qt::QueuedConnection);
+    vx::connect(
+        this, "2triggerNubsieRepaintQueued(bool)", this, "1updateNubsiePositions(bool)", Qt::QueuedConnection);
 
     m_longClickTimer.setSingleShot(true);
     m_longClickTimer.setInterval(c_LongClickTime);
@@ -162,9 +158,10 @@ void MultiNubsieSlider::addNubsie(Nubsie* nubsie)
     vx::connect(nubsie, "2valueChanged(int)", this, "1nubsieValueChanged(int)", Qt::AutoConnection);
     vx::connect(nubsie, "2valueChangedbyPopover(int)", this, "1nubsieValueChanged(int)", Qt::AutoConnection);
     vx::connect(nubsie->sizeAnimator(), "2valueChanged(const QVariant&)", nubsie, "1update()", Qt::AutoConnection);
-    vx::connect(nubsie->positionAnimator(), "2valueChanged(const QVariant&)", this, "1update()", Qt::AutoConnection);
-    vx::connect(nubsie, "2dragSizeChanged(Nubsie*,QSize)", this, "1dragSizeChanged(Nubsie*,QSize)",
-        Qt::AutoConnection);
+    vx::connect(
+        nubsie->positionAnimator(), "2valueChanged(const QVariant&)", this, "1update()", Qt::AutoConnection);
+    vx::connect(
+        nubsie, "2dragSizeChanged(Nubsie*,QSize)", this, "1dragSizeChanged(Nubsie*,QSize)", Qt::AutoConnection);
     m_nubsies.append(nubsie);
     nubsie->setNubsieSlider(this);
     if (Nubsie* const first = firstLiveNubsie()) {
@@ -449,307 +446,5 @@ void MultiNubsieSlider::stopNubsieAnimations()
 void MultiNubsieSlider::cancelAnimations()
 {
     stopNubsieAnimations();
-}
-
-// Stacking ---------------------------------------------------------------------------------------------------
-
-void MultiNubsieSlider::raiseNubsies()
-{
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie) {
-            nubsie->raise();
-        }
-    }
-}
-
-void MultiNubsieSlider::raiseNubsieOnSlider(Nubsie* kingNubsie)
-{
-    const QPointer<MultiNubsieSlider> self(this);
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    const QPointer<Nubsie> king(kingNubsie);
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie && king && nubsie != king) {
-            nubsie->stackUnder(king);
-        }
-    }
-    if (self) {
-        raiseNubsieOverRivals();
-    }
-}
-
-void MultiNubsieSlider::raiseNubsieOverRivals()
-{
-    // A rival's own handles stay where they are; it is only a reason to put ours under the one in use.
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    const QPointer<Nubsie> current = m_currentNubsie;
-    const auto rivals = m_rivals;
-    for (const QPointer<MultiNubsieSlider>& rival : rivals) {
-        if (!rival) {
-            continue;
-        }
-        for (const QPointer<Nubsie>& nubsie : nubsies) {
-            if (nubsie && current) {
-                nubsie->stackUnder(current);
-            }
-        }
-    }
-}
-
-void MultiNubsieSlider::stackNubsiesUnder(QWidget* widget)
-{
-    const QPointer<QWidget> over(widget);
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie && over) {
-            nubsie->stackUnder(over);
-        }
-    }
-}
-
-void MultiNubsieSlider::stackNubsiesOver(QWidget* widget)
-{
-    QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    nubsies.removeAll(QPointer<Nubsie>());
-    if (nubsies.isEmpty() || widget == nullptr) {
-        return;
-    }
-    const QPointer<QWidget> under(widget);
-    const QPointer<Nubsie> first = nubsies.constFirst();
-    const QPointer<Nubsie> last = nubsies.constLast();
-    if (first != last) {
-        last->stackUnder(first);
-        for (int i = 1; i < nubsies.size() - 1; ++i) {
-            if (nubsies.at(i) && first) {
-                nubsies.at(i)->stackUnder(first);
-            }
-        }
-    }
-    if (under && last) {
-        under->stackUnder(last);
-    }
-}
-
-void MultiNubsieSlider::addRival(MultiNubsieSlider* other)
-{
-    if (other == nullptr || m_rivals.contains(other)) {
-        return;
-    }
-    m_rivals.append(other);
-    other->m_rivals.append(this);
-}
-
-// The slider as a whole --------------------------------------------------------------------------------------
-
-QFlags<MultiNubsieSlider::EMultiNubsieSliderFeatures> MultiNubsieSlider::getFeatures() const
-{
-    return m_features;
-}
-
-void MultiNubsieSlider::setFeatures(QFlags<EMultiNubsieSliderFeatures> features)
-{
-    m_features = features;
-    setInActiveOpacity();
-}
-
-Qt::Orientation MultiNubsieSlider::orientation() const
-{
-    return m_orientation;
-}
-
-void MultiNubsieSlider::setOrientation(Qt::Orientation orientation)
-{
-    m_orientation = orientation;
-    updateNubsiePositions(false);
-}
-
-double MultiNubsieSlider::sliderBarExtent() const
-{
-    return m_sliderBarExtent;
-}
-
-void MultiNubsieSlider::setSliderBarExtent(double extent)
-{
-    m_sliderBarExtent = extent;
-    update();
-}
-
-bool MultiNubsieSlider::getDrawTrack() const
-{
-    return m_drawTrack;
-}
-
-void MultiNubsieSlider::setDrawTrack(bool draw)
-{
-    m_drawTrack = draw;
-}
-
-void MultiNubsieSlider::setDrawProgress(bool draw)
-{
-    m_drawProgress = draw;
-    update();
-}
-
-QColor MultiNubsieSlider::getProgressColor() const
-{
-    return m_progressColor;
-}
-
-void MultiNubsieSlider::setProgressColor(const QColor& color)
-{
-    m_progressColor = color;
-}
-
-void MultiNubsieSlider::setProgress(double progress)
-{
-    m_progress = qBound(0.0, progress, 1.0);
-    update();
-}
-
-double MultiNubsieSlider::getProgress() const
-{
-    return m_progress;
-}
-
-double MultiNubsieSlider::getOpacity() const
-{
-    return m_opacityFactor;
-}
-
-void MultiNubsieSlider::setOpacity(double opacity)
-{
-    m_opacityFactor = opacity;
-}
-
-void MultiNubsieSlider::setActiveOpacity()
-{
-    m_opacityAnimator.stop();
-    if (m_features.testFlag(emfFadeWhenInactive)) {
-        m_opacityAnimator.setEasingCurve(QEasingCurve::OutExpo);
-        m_opacityAnimator.setDuration(c_FadeInTime);
-        m_opacityAnimator.setEndValue(1.0);
-        m_opacityAnimator.start();
-    }
-}
-
-void MultiNubsieSlider::setInActiveOpacity()
-{
-    m_opacityAnimator.stop();
-    if (m_features.testFlag(emfFadeWhenInactive)) {
-        m_opacityFactor = 1.0;
-        m_opacityAnimator.setEasingCurve(QEasingCurve::InExpo);
-        m_opacityAnimator.setDuration(c_FadeOutTime);
-        m_opacityAnimator.setEndValue(s_OpacityFadeValue);
-        m_opacityAnimator.start();
-    }
-}
-
-void MultiNubsieSlider::hideNubsieBalloons()
-{
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie) {
-            nubsie->hideBalloon();
-        }
-    }
-}
-
-void MultiNubsieSlider::nubsieValueChanged(int value)
-{
-    if (const auto* const nubsie = qobject_cast<Nubsie*>(sender())) {
-        Q_EMIT nubsieValueChangedByUser(nubsie->id(), value);
-    }
-}
-
-void MultiNubsieSlider::dragSizeChanged(Nubsie* nubsie, QSize size)
-{
-    Q_UNUSED(size)
-    if (nubsie != nullptr && nubsie == m_currentNubsie) {
-        updateNubsieLayer(nubsie);
-    }
-}
-
-// Events -----------------------------------------------------------------------------------------------------
-
-void MultiNubsieSlider::showEvent(QShowEvent* event)
-{
-    m_nubsiesShown = true;
-    const QPointer<MultiNubsieSlider> self(this);
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie) {
-            nubsie->show();
-        }
-    }
-    if (!self) {
-        return;
-    }
-    updateNubsiePositions(false);
-    if (self) {
-        QWidget::showEvent(event);
-    }
-}
-
-void MultiNubsieSlider::hideEvent(QHideEvent* event)
-{
-    m_nubsiesShown = false;
-    const QPointer<MultiNubsieSlider> self(this);
-    const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-    for (const QPointer<Nubsie>& nubsie : nubsies) {
-        if (nubsie) {
-            nubsie->hide();
-        }
-    }
-    if (self) {
-        QWidget::hideEvent(event);
-    }
-}
-
-void MultiNubsieSlider::moveEvent(QMoveEvent* event)
-{
-    QWidget::moveEvent(event);
-    layOutNowAndLater();
-}
-
-void MultiNubsieSlider::resizeEvent(QResizeEvent* event)
-{
-    QWidget::resizeEvent(event);
-    layOutNowAndLater();
-}
-
-// At once, and again when the geometry of the whole window is final.
-void MultiNubsieSlider::layOutNowAndLater()
-{
-    const QPointer<MultiNubsieSlider> self(this);
-    stopNubsieAnimations();
-    if (self) {
-        updateNubsiePositions(false);
-    }
-    if (self) {
-        Q_EMIT triggerNubsieRepaintQueued(false);
-    }
-}
-
-void MultiNubsieSlider::changeEvent(QEvent* event)
-{
-    if (event->type() == QEvent::EnabledChange) {
-        const QPointer<MultiNubsieSlider> self(this);
-        const QList<QPointer<Nubsie>> nubsies = m_nubsies;
-        for (const QPointer<Nubsie>& nubsie : nubsies) {
-            // Those in the window do not inherit the state.
-            if (self && nubsie && nubsie->parentWidget() != this) {
-                nubsie->setEnabled(isEnabled());
-            }
-        }
-        if (!self) {
-            return;
-        }
-    }
-    QWidget::changeEvent(event);
-}
-
-void MultiNubsieSlider::contextMenuEvent(QContextMenuEvent* event)
-{
-    Q_UNUSED(event)
 }
 }

@@ -29,29 +29,29 @@ namespace PopoverWidget
 class Item;
 }
 
-/// A slider with any number of handles on one scale, each with its own range, value and features: a time line with a
-/// date handle and the ends of an export range, or a plain value slider with one handle.
+/// A slider with any number of handles on one scale, each with its own range, value and features: a time line with
+/// a date handle and the ends of an export range, or a plain value slider with one handle.
 ///
-/// Handles at rest do not overlap. Where true values lie closer together than a handle is wide, the drawn places are
-/// pushed apart into a row, which is centred on the true values; Nubsie has the two numbers. A handle that is held is
-/// taken out of its row, its neighbours drift home, and at the release it is put back.
+/// Handles at rest do not overlap. Where true values lie closer together than a handle is wide, the drawn places
+/// are pushed apart into a row, which is centred on the true values; Nubsie has the two numbers. A handle that is
+/// held is taken out of its row, its neighbours drift home, and at the release it is put back.
 ///
 /// A drag follows the pointer one to one near the bar. Farther than 24 pixels off its centre line the handle moves
 /// the slower the farther the pointer is, which lets a user scrub a day to the second.
 ///
 /// Handles are widgets, children of the slider's window, so that they can grow over the slider's edges: put the
-/// slider into its window before adding handles. They follow the slider as it moves and resizes, is shown, hidden and
-/// disabled; repaintNubsiesQueued() brings them after where something else moved, such as a parent of the slider.
-/// Nothing is laid out while the slider is not visible.
+/// slider into its window before adding handles. They follow the slider as it moves and resizes, is shown, hidden
+/// and disabled; repaintNubsiesQueued() brings them after where something else moved, such as a parent of the
+/// slider. Nothing is laid out while the slider is not visible.
 ///
 /// Two small flags, hidden at first, can mark the ends of a range. They are labels in the slider, whose places the
 /// client sets: see getFirstFlag().
 ///
 /// Signals of a drag of a handle with enfLiveDrag: nubsieDragStarted and the press slot; for each change of the
-/// integer value the drag slot and nubsieValueChangedByUser; the release slot and nubsieDragEnded. Without enfLiveDrag
-/// nubsieValueChangedByUser comes once, before the release slot. With enfResetOnRelease the release slot is followed
-/// by nubsieValueChangedByUser and nubsieDragEnded, both twice: clients rely on it. A plain click emits
-/// nubsieDragStarted and no nubsieDragEnded.
+/// integer value the drag slot and nubsieValueChangedByUser; the release slot and nubsieDragEnded. Without
+/// enfLiveDrag nubsieValueChangedByUser comes once, before the release slot. With enfResetOnRelease the release
+/// slot is followed by nubsieValueChangedByUser and nubsieDragEnded, both twice: clients rely on it. A plain click
+/// emits nubsieDragStarted and no nubsieDragEnded.
 ///
 /// An id that no handle has is ignored, or answered with 0, false or an invalid date.
 class ZELKOV_WIDGETS_EXPORT MultiNubsieSlider : public QWidget
@@ -68,7 +68,8 @@ public:
     static constexpr int s_NubsieTextMargin = 4; ///< distance of the number labels from the bar, in pixels
     static constexpr int s_NubsieMargin = 0; ///< adds nothing
     static constexpr int s_SlidingAccuracyShearing = 50; ///< not used
-    static constexpr int s_SlidingAccuracyBorder = 25; ///< from here on off the centre line a drag is fine, in pixels
+    /// From here on off the centre line a drag is fine, in pixels.
+    static constexpr int s_SlidingAccuracyBorder = 25;
     static constexpr unsigned int s_FlagLongPressThreshold = 1000; ///< ms
     static constexpr double s_OpacityFadeValue = 0.25; ///< opacity of an inactive slider
 
@@ -91,8 +92,8 @@ public:
     };
     Q_ENUM(EMultiNubsieSliderFlagColor)
 
-    /// With a @p window other than null and this slider, the slider deletes its handles with itself. Otherwise they
-    /// stay behind and live as long as the window that they were put into.
+    /// With a @p window other than null and this slider, the slider deletes its handles with itself. Otherwise
+    /// they stay behind and live as long as the window that they were put into.
     explicit MultiNubsieSlider(QWidget* parent = nullptr, QWidget* window = nullptr);
     ~MultiNubsieSlider() override;
 

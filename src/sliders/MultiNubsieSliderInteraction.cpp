@@ -4,9 +4,7 @@
 #include "sliders/NubsieDrag.h"
 #include "sliders/NubsieGeometry.h"
 
-#include <QtGui/QHelpEvent>
 #include <QtGui/QMouseEvent>
-#include <QtWidgets/QToolTip>
 
 #include <cmath>
 
@@ -463,7 +461,8 @@ void MultiNubsieSlider::singleClickPerformed()
     }
     const QPointer<MultiNubsieSlider> self(this);
     const QPointer<Nubsie> clicked = m_currentNubsie;
-    if (!m_moved && clicked->getCurrentFeature().testFlag(Nubsie::enfValuePopover)
+    if (!m_moved
+        && clicked->getCurrentFeature().testFlag(Nubsie::enfValuePopover)
         // The key itself is looked up: only a range of exactly this one value opens the popover.
         && clicked->itemMap().contains(ValueRange(clicked->value(false)))) {
         clicked->showValuePopover();
@@ -589,70 +588,5 @@ void MultiNubsieSlider::startFlagLongClickTimer()
 void MultiNubsieSlider::stopFlagLongClickTimer()
 {
     m_flagLongClickTimer.stop();
-}
-
-// Other events -----------------------------------------------------------------------------------------------
-
-// The base class is left out of both, on purpose.
-void MultiNubsieSlider::enterEvent(QEvent* event)
-{
-    Q_UNUSED(event)
-    setActiveOpacity();
-}
-
-void MultiNubsieSlider::leaveEvent(QEvent* event)
-{
-    Q_UNUSED(event)
-    setInActiveOpacity();
-}
-
-bool MultiNubsieSlider::event(QEvent* event)
-{
-    if (event->type() == QEvent::ToolTip) {
-        const auto* const help = static_cast<QHelpEvent*>(event);
-        Nubsie* const nubsie = getNubsieForPos(help->pos());
-        if (nubsie != nullptr && !nubsie->toolTipText().isEmpty()) {
-            QToolTip::showText(mapToGlobal(help->pos()), nubsie->toolTipText(), nubsie, QRect());
-            return true;
-        }
-        if (flagHit(m_firstFlag, help->pos()) || flagHit(m_secondFlag, help->pos())) {
-            QToolTip::showText(mapToGlobal(help->pos()), tr("Time range to export"), nubsie, QRect());
-            return true;
-        }
-    }
-    return QWidget::event(event);
-}
-
-bool MultiNubsieSlider::handleEvent(QEvent* event)
-{
-    this->event(event);
-    return event->isAccepted();
-}
-
-bool MultiNubsieSlider::eventFilter(QObject* object, QEvent* event)
-{
-    const QPointer<QObject> watched(object);
-    const QPointer<MultiNubsieSlider> self(this);
-    switch (event->type()) {
-    case QEvent::MouseButtonPress:
-        mousePressEvent(static_cast<QMouseEvent*>(event));
-        break;
-    case QEvent::MouseButtonRelease:
-        mouseReleaseEvent(static_cast<QMouseEvent*>(event));
-        break;
-    case QEvent::MouseMove:
-        mouseMoveEvent(static_cast<QMouseEvent*>(event));
-        break;
-    case QEvent::MouseButtonDblClick:
-        mouseDoubleClickEvent(static_cast<QMouseEvent*>(event));
-        break;
-    default:
-        break;
-    }
-    // An object that a slot has deleted must not get the event any more.
-    if (!watched) {
-        return true;
-    }
-    return self ? QObject::eventFilter(object, event) : false;
 }
 }

@@ -84,8 +84,8 @@ Mapped mapped(double target, const Anchor& anchor)
 
 double stepTravel(int sliderLength, int draggedLength, int minimum, int maximum)
 {
-    const qint64 steps = static_cast<qint64>(maximum) - minimum + 1;
-    return std::min(static_cast<double>(sliderLength), static_cast<double>(draggedLength * steps) * s_StepFactor);
+    const double steps = static_cast<double>(maximum) - minimum + 1.0;
+    return std::min(static_cast<double>(sliderLength), draggedLength * steps * s_StepFactor);
 }
 
 double steppedValue(double way, double travel, double anchor)

@@ -14,9 +14,9 @@ namespace vx
 /// All functions are pure. A display value is a place on the scale, 0 to 1; 0 is on the left or at the bottom.
 namespace NubsieGeometry
 {
-/// The bar of a slider with the rectangle @p area, in the slider's coordinates; @p area itself if that is empty. The
-/// thickness is half of @p barExtent and at least one pixel, the offset is measured with the whole of it: the bar
-/// lies off the centre line by a quarter of it, on purpose.
+/// The bar of a slider with the rectangle @p area, in the slider's coordinates; @p area itself if that is empty.
+/// The thickness is half of @p barExtent and at least one pixel, the offset is measured with the whole of it: the
+/// bar lies off the centre line by a quarter of it, on purpose.
 ZELKOV_WIDGETS_EXPORT QRectF barRect(const QRect& area, double barExtent, Qt::Orientation orientation);
 
 /// The length that the display values of a handle of this size run through.

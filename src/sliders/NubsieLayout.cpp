@@ -69,8 +69,7 @@ void centre(Place* row, int count, const Block& block, double length)
     const Ends ends = endsOf(row, block, length);
     double delta;
     if (shift > 0.0) {
-        const double room
-            = block.first > 0 ? ends.least - row[block.first - 1].display - length : ends.least;
+        const double room = block.first > 0 ? ends.least - row[block.first - 1].display - length : ends.least;
         delta = -std::min(room, shift);
     } else {
         const double room
@@ -128,7 +127,7 @@ std::vector<int> sortedByDisplay(const std::vector<Place>& places)
 
 Block enqueue(Place* row, int count, int seed, double length)
 {
-    Block block{seed, seed};
+    Block block {seed, seed};
 
     double limit = row[seed].display + length;
     block.last = pushUp(row, count, seed, limit, length);
@@ -196,7 +195,7 @@ Drift dequeue(Place* row, int count, int index, double length)
         pullBelow = std::min(below->value - below->display, above ? gap() : 1.0 - below->display);
     }
 
-    Drift drift{{index, index - 1}, {index + 1, index}};
+    Drift drift {{index, index - 1}, {index + 1, index}};
     if (pullAbove > pullBelow) {
         drift.above = pullInThoseAbove(row, count, index, pullAbove);
         if (above && below) {

@@ -25,17 +25,17 @@ struct Block
     int last;
 };
 
-/// A handle's length in units of the scale, for a handle of @p size on a scale that is @p extent pixels long. A scale
-/// that is shorter than the handle gives a negative length: nothing is kept apart there.
+/// A handle's length in units of the scale, for a handle of @p size on a scale that is @p extent pixels long. A
+/// scale that is shorter than the handle gives a negative length: nothing is kept apart there.
 ZELKOV_WIDGETS_EXPORT double handleLength(double size, double extent);
 
 /// The indexes of the places in the order in which they are drawn; equal ones in the given order.
 ZELKOV_WIDGETS_EXPORT std::vector<int> sortedByDisplay(const std::vector<Place>& places);
 
 /// Puts the handle at @p seed among its neighbours: those that are nearer than @p length to it, or to one that it
-/// pushed, are pushed away; the block is shifted into the scale, the top first, and then toward the mean of its true
-/// values as far as the scale and the next neighbours let it. A handle alone comes back to its true value. Returns
-/// the block; only handles in it have moved.
+/// pushed, are pushed away; the block is shifted into the scale, the top first, and then toward the mean of its
+/// true values as far as the scale and the next neighbours let it. A handle alone comes back to its true value.
+/// Returns the block; only handles in it have moved.
 ZELKOV_WIDGETS_EXPORT Block enqueue(Place* row, int count, int seed, double length);
 
 /// The handles that drifted home when one was taken out.
@@ -49,15 +49,16 @@ struct Drift
 /// displaced further first, the other one with what room that leaves. The handle itself keeps its place.
 ZELKOV_WIDGETS_EXPORT Drift dequeue(Place* row, int count, int index, double length);
 
-/// Moves the handles above @p index down toward their true values, each by at most what the one before it moved and
-/// the first by at most @p amount, up to the first that is not above its true value. Returns those that were touched.
+/// Moves the handles above @p index down toward their true values, each by at most what the one before it moved
+/// and the first by at most @p amount, up to the first that is not above its true value. Returns those that were
+/// touched.
 ZELKOV_WIDGETS_EXPORT Block pullInThoseAbove(Place* row, int count, int index, double amount);
 /// The mirror image.
 ZELKOV_WIDGETS_EXPORT Block pullInThoseBelow(Place* row, int index, double amount);
 
-/// Enqueues every handle once, in the given order, with the length at the same index. What comes out is what comes out
-/// of sorting anew before each of them, to the last bit; the row is sorted once, since a handle hardly ever passes
-/// another.
+/// Enqueues every handle once, in the given order, with the length at the same index. What comes out is what comes
+/// out of sorting anew before each of them, to the last bit; the row is sorted once, since a handle hardly ever
+/// passes another.
 ZELKOV_WIDGETS_EXPORT void enqueueAll(std::vector<Place>& places, const std::vector<double>& lengths);
 }
 }

@@ -73,7 +73,7 @@ Entry multiNubsieSlider()
     entry.create = [](QWidget* host) {
         vx::PopoverWidget::Manager::init(0);
         auto* const slider = new RobustTimeLine(host);
-        return Subject{slider, slider};
+        return Subject {slider, slider};
     };
     entry.exercise = {
         {"drag", {"nubsieDragStarted", "nubsieValueChangedByUser", "nubsieDragEnded"},
@@ -98,7 +98,8 @@ Entry multiNubsieSlider()
         {"second flag, long", {"secondFlagLongClicked"},
             {mousePress(timeLineSecondFlag, 0), timeLineTimeout(1000), mouseRelease(timeLineSecondFlag, 10)}},
         {"first flag, right", {"firstFlagRightClicked"},
-            {mousePress(timeLineFirstFlag, 0, Qt::RightButton), mouseRelease(timeLineFirstFlag, 10, Qt::RightButton)}},
+            {mousePress(timeLineFirstFlag, 0, Qt::RightButton),
+                mouseRelease(timeLineFirstFlag, 10, Qt::RightButton)}},
         {"second flag, right", {"secondFlagRightClicked"},
             {mousePress(timeLineSecondFlag, 0, Qt::RightButton),
                 mouseRelease(timeLineSecondFlag, 10, Qt::RightButton)}},

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the tests of the slider with several handles share: a window with a slider of 220 pixels, whose handles of 20
-// pixels have a way of 200, and a journal of its signals and of the slots that handles call.
+// What the tests of the slider with several handles share: a window with a slider of 220 pixels, whose handles of
+// 20 pixels have a way of 200, and a journal of its signals and of the slots that handles call.
 #pragma once
 
 #include "CoreQt/QtSlot.h"
@@ -30,16 +30,17 @@ public:
     void follow(vx::MultiNubsieSlider* slider)
     {
         using Slider = vx::MultiNubsieSlider;
-        connect(slider,
-            static_cast<void (Slider::*)(vx::NubsieID, int)>(&Slider::nubsieValueChanged), this,
+        connect(slider, static_cast<void (Slider::*)(vx::NubsieID, int)>(&Slider::nubsieValueChanged), this,
             [this](int id, int value) { note(QStringLiteral("value %1 %2").arg(id).arg(value)); });
         connect(slider, &Slider::nubsieValueChangedByUser, this,
             [this](int id, int value) { note(QStringLiteral("changed %1 %2").arg(id).arg(value)); });
         connect(slider, &Slider::nubsieDragStarted, this,
             [this](int id) { note(QStringLiteral("started %1").arg(id)); });
-        connect(slider, &Slider::nubsieDragEnded, this, [this](int id) { note(QStringLiteral("ended %1").arg(id)); });
-        connect(slider, &Slider::triggerNubsieRepaintQueued, this,
-            [this](bool animate) { note(animate ? QStringLiteral("queued animated") : QStringLiteral("queued")); });
+        connect(
+            slider, &Slider::nubsieDragEnded, this, [this](int id) { note(QStringLiteral("ended %1").arg(id)); });
+        connect(slider, &Slider::triggerNubsieRepaintQueued, this, [this](bool animate) {
+            note(animate ? QStringLiteral("queued animated") : QStringLiteral("queued"));
+        });
         connect(slider, &Slider::firstFlagClicked, this, [this] { note(QStringLiteral("first clicked")); });
         connect(slider, &Slider::secondFlagClicked, this, [this] { note(QStringLiteral("second clicked")); });
         connect(slider, &Slider::firstFlagLongClicked, this, [this] { note(QStringLiteral("first long")); });
@@ -100,9 +101,9 @@ inline QPixmap disc(const QColor& color = Qt::red)
     return result;
 }
 
-/// The slider stands at (100, 230) in a window of 600 by 500: the pointer can go 270 pixels sideways. Horizontal, it is
-/// 220 by 40; a handle with display value d has its middle at (9 + 200 d, 17.5) for hits, one pixel to the upper left
-/// of where it is seen.
+/// The slider stands at (100, 230) in a window of 600 by 500: the pointer can go 270 pixels sideways. Horizontal,
+/// it is 220 by 40; a handle with display value d has its middle at (9 + 200 d, 17.5) for hits, one pixel to the
+/// upper left of where it is seen.
 class Scene
 {
 public:
@@ -111,7 +112,8 @@ public:
     {
         host.resize(600, 500);
         slider->setOrientation(orientation);
-        slider->setGeometry(100, 230, orientation == Qt::Horizontal ? 220 : 40, orientation == Qt::Horizontal ? 40 : 220);
+        slider->setGeometry(
+            100, 230, orientation == Qt::Horizontal ? 220 : 40, orientation == Qt::Horizontal ? 40 : 220);
         journal.follow(slider);
     }
 

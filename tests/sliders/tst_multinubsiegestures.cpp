@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // What the user does with the handles of a slider, by real mouse events; every signal and slot in order.
-#include "TimeLineScene.h"
 #include "support/SignalRecorder.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "TimeLineScene.h"
 
 #include <QtCore/QElapsedTimer>
 #include <QtGui/QHelpEvent>
@@ -102,7 +102,8 @@ private Q_SLOTS:
     void thePointerFadesTheSlider();
 };
 
-// --- Hits --------------------------------------------------------------------------------------------------------
+// --- Hits
+// --------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::aPressBesideTheDiscIsIgnored()
 {
@@ -154,12 +155,13 @@ void TestMultiNubsieGestures::aPressMovesTheHandleToTheEndOfTheList()
     Pointer pointer(scene.slider);
     pointer.move(middle);
     pointer.press();
-    const QList<QPointer<Nubsie>> expected{two, three, one};
+    const QList<QPointer<Nubsie>> expected {two, three, one};
     QCOMPARE(scene.slider->getNubsies(), expected);
     pointer.release();
 }
 
-// --- Clicks ------------------------------------------------------------------------------------------------------
+// --- Clicks
+// ------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::aClickIsSettledAfterTheDoubleClickInterval()
 {
@@ -243,8 +245,8 @@ void TestMultiNubsieGestures::aDoubleClickCanReset()
     pointer.click(middle);
     pointer.press();
     QCOMPARE(scene.slider->value(1), 50);
-    const QStringList reset = list({"started 1", "press 100", "click 100", "doubleClick 100", "changed 1 50", "queued",
-        "ended 1", "changed 1 50"});
+    const QStringList reset = list({"started 1", "press 100", "click 100", "doubleClick 100", "changed 1 50",
+        "queued", "ended 1", "changed 1 50"});
     QCOMPARE(scene.journal.lines, reset);
     // The value is not that of the press any more, so that the release ends a drag.
     pointer.release();
@@ -308,7 +310,8 @@ void TestMultiNubsieGestures::aPressOnAnotherHandlePutsTheFirstOneBack()
     pointer.release();
 }
 
-// --- Drags -------------------------------------------------------------------------------------------------------
+// --- Drags
+// -------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::aLiveDragReportsEachChange()
 {
@@ -372,8 +375,7 @@ void TestMultiNubsieGestures::aDragEndsAtBothEndsOfTheScale()
     QCOMPARE(scene.slider->value(1), 0);
     QCOMPARE(scene.drawn(1), 0.0);
     pointer.release();
-    QCOMPARE(scene.journal.lines,
-        list({"started 1", "changed 1 200", "changed 1 0", "ended 1"}));
+    QCOMPARE(scene.journal.lines, list({"started 1", "changed 1 200", "changed 1 0", "ended 1"}));
 }
 
 void TestMultiNubsieGestures::aHandleThatWasPushedAsideStartsWithoutAJump()
@@ -442,8 +444,8 @@ void TestMultiNubsieGestures::aDragOnAVerticalSliderGoesUpward()
     QCOMPARE(scene.slider->value(1), 200);
     pointer.release();
     QCOMPARE(scene.journal.lines,
-        list({"started 1", "press 50", "drag 61", "changed 1 61", "drag 200", "changed 1 200", "release 200 at 17,-80",
-            "ended 1"}));
+        list({"started 1", "press 50", "drag 61", "changed 1 61", "drag 200", "changed 1 200",
+            "release 200 at 17,-80", "ended 1"}));
 }
 
 void TestMultiNubsieGestures::aSpringGoesBackWithDoubledSignals()
@@ -502,7 +504,8 @@ void TestMultiNubsieGestures::anotherButtonDoesNotSettleTheDrag()
     QCOMPARE(scene.journal.lines, list({"started 1", "changed 1 119", "ended 1"}));
 }
 
-// --- Fine scrubbing ----------------------------------------------------------------------------------------------
+// --- Fine scrubbing
+// ----------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::twentyFourPixelsOffTheLineIsOneToOne()
 {
@@ -574,7 +577,8 @@ void TestMultiNubsieGestures::aDateHandleIsSlowest()
     pointer.release();
 }
 
-// --- Steps -------------------------------------------------------------------------------------------------------
+// --- Steps
+// -------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::discreteStepsGoByTheSizeOfTheHandle()
 {
@@ -688,7 +692,8 @@ void TestMultiNubsieGestures::aStepThatChangedTheValueIsNoFlick()
     QCOMPARE(scene.slider->value(1), 1);
 }
 
-// --- Long clicks -------------------------------------------------------------------------------------------------
+// --- Long clicks
+// -------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::aLongClickEndsTheGesture()
 {
@@ -793,7 +798,8 @@ void TestMultiNubsieGestures::thirtyPixelsAwayIsStillALongClickThirtyOneIsNot()
     pointer.release();
 }
 
-// --- The rest ----------------------------------------------------------------------------------------------------
+// --- The rest
+// ----------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieGestures::aClickOnTheTrackMovesTheOnlyHandle()
 {
@@ -927,9 +933,8 @@ void TestMultiNubsieGestures::handlesRemovedInMidGestureAreForgotten()
 void TestMultiNubsieGestures::aHandleRemovedInASlotOfItsOwn_data()
 {
     QTest::addColumn<QString>("moment");
-    for (const char* moment :
-        {"started 1", "press 100", "drag 119", "changed 1 119", "release", "changed 1 100", "ended 1", "click 100",
-            "doubleClick 100", "longClick 100"}) {
+    for (const char* moment : {"started 1", "press 100", "drag 119", "changed 1 119", "release", "changed 1 100",
+             "ended 1", "click 100", "doubleClick 100", "longClick 100"}) {
         QTest::newRow(moment) << QString::fromLatin1(moment);
     }
 }

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // Clicks that open the value popover of a handle, and the balloons of handles in a slider.
-#include "TimeLineScene.h"
 #include "popover/Controller.h"
 #include "popover/Item.h"
 #include "popover/Manager.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "TimeLineScene.h"
 
 #include <QtWidgets/QApplication>
 
@@ -27,7 +27,8 @@ const QPoint middle(109, 17); // on a handle drawn at 0.5
 struct Row : Item
 {
     explicit Row(int value)
-        : Item(nullptr, vx::PopoverWidget::eifText, value, QString::number(value), QString::number(value), QString())
+        : Item(
+            nullptr, vx::PopoverWidget::eifText, value, QString::number(value), QString::number(value), QString())
     {
         setUserData(value);
     }
@@ -118,7 +119,7 @@ void TestMultiNubsiePopover::theFeatureIsReadAtTheValue()
     Nubsie* const handle = scene.add(1, 100);
     scene.slider->addFeatures(1, Nubsie::enfValuePopover);
     scene.slider->setItemMap(1, {{{100}, new Row(100)}});
-    handle->setFeatureMap(QMap<vx::ValueRange, Nubsie::ENubsieFeatures>{{{90, 110}, Nubsie::enfDraggable}});
+    handle->setFeatureMap(QMap<vx::ValueRange, Nubsie::ENubsieFeatures> {{{90, 110}, Nubsie::enfDraggable}});
     scene.show();
     Pointer pointer(scene.slider);
     pointer.move(middle);

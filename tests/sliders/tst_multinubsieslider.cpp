@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The model of a slider with several handles: ids, values, layout in the window, stacking, and what it does as a widget.
-#include "TimeLineScene.h"
+// The model of a slider with several handles: ids, values, layout in the window, stacking, and what it does as a
+// widget.
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "TimeLineScene.h"
 
 #include <QtGui/QContextMenuEvent>
 #include <QtWidgets/QApplication>
@@ -162,12 +163,13 @@ void TestMultiNubsieSlider::signalsSlotsAndPropertiesKeepTheirOrder()
     for (int i = meta.propertyOffset(); i < meta.propertyCount(); ++i) {
         properties << QString::fromLatin1(meta.property(i).name());
     }
-    QCOMPARE(properties,
-        list({"opacityFactor", "orientation", "sliderBarExtent", "drawTrack", "progressColor"}));
-    QCOMPARE(meta.method(meta.methodOffset()).methodSignature(), QByteArray("nubsieValueChanged(vx::NubsieID,int)"));
+    QCOMPARE(properties, list({"opacityFactor", "orientation", "sliderBarExtent", "drawTrack", "progressColor"}));
+    QCOMPARE(
+        meta.method(meta.methodOffset()).methodSignature(), QByteArray("nubsieValueChanged(vx::NubsieID,int)"));
 }
 
-// --- Handles -----------------------------------------------------------------------------------------------------
+// --- Handles
+// -----------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieSlider::anIdIsTakenOnce()
 {
@@ -220,7 +222,7 @@ void TestMultiNubsieSlider::aHandleOfOnesOwnIsAdopted()
     QCOMPARE(scene.slider->nubsie(9), mine);
     QVERIFY(mine->isVisible());
     // Under those that are there, and laid out one turn of the loop later.
-    QCOMPARE(stack(scene.host), (QList<int>{9, 1}));
+    QCOMPARE(stack(scene.host), (QList<int> {9, 1}));
     QVERIFY(seenAt(mine) != QPoint(260, 249));
     QCoreApplication::processEvents();
     QCOMPARE(seenAt(mine), QPoint(260, 249));
@@ -238,7 +240,7 @@ void TestMultiNubsieSlider::removedHandlesAreGone()
     const QPointer<Nubsie> three = scene.add(3, 180);
     scene.slider->removeNubsie(2);
     QVERIFY(!two);
-    QCOMPARE(scene.slider->getNubsies(), (QList<QPointer<Nubsie>>{one, three}));
+    QCOMPARE(scene.slider->getNubsies(), (QList<QPointer<Nubsie>> {one, three}));
     scene.slider->removeAllNubsies();
     QVERIFY(!one && !three);
     QVERIFY(scene.slider->getNubsies().isEmpty());
@@ -326,7 +328,8 @@ void TestMultiNubsieSlider::handlesStayBehindOtherwise()
     QCOMPARE(handle->parentWidget(), &host);
 }
 
-// --- Values ------------------------------------------------------------------------------------------------------
+// --- Values
+// ------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieSlider::setValueReportsIfAsked()
 {
@@ -494,7 +497,8 @@ void TestMultiNubsieSlider::blinking()
     QVERIFY(!scene.slider->isBlinkingNubsie(1));
 }
 
-// --- Layout ------------------------------------------------------------------------------------------------------
+// --- Layout
+// ------------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieSlider::handlesStandOnTheBar()
 {
@@ -603,9 +607,9 @@ void TestMultiNubsieSlider::nothingIsLaidOutWhileHidden()
     scene.add(1, 100);
     scene.add(2, 104);
     scene.slider->updateNubsiePositions(false);
-    QCOMPARE(drawn(scene, {1, 2}), (QVector<double>{0.5, 0.52}));
+    QCOMPARE(drawn(scene, {1, 2}), (QVector<double> {0.5, 0.52}));
     scene.slider->setValue(2, 102, false, true);
-    QCOMPARE(drawn(scene, {1, 2}), (QVector<double>{0.5, 0.51}));
+    QCOMPARE(drawn(scene, {1, 2}), (QVector<double> {0.5, 0.51}));
     QCOMPARE(scene.journal.lines, list({"changed 2 102"}));
 }
 
@@ -735,7 +739,8 @@ void TestMultiNubsieSlider::manyHandles()
     QVERIFY(qAbs(places.constFirst() + 1.9) < 1e-9);
 }
 
-// --- Stacking ----------------------------------------------------------------------------------------------------
+// --- Stacking
+// ----------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieSlider::handlesStackAsTold()
 {
@@ -745,9 +750,9 @@ void TestMultiNubsieSlider::handlesStackAsTold()
     scene.add(3, 120);
     scene.add(4, 180);
     // Each new one goes under the first.
-    QCOMPARE(stack(scene.host), (QList<int>{2, 3, 4, 1}));
+    QCOMPARE(stack(scene.host), (QList<int> {2, 3, 4, 1}));
     scene.slider->raiseNubsies();
-    QCOMPARE(stack(scene.host), (QList<int>{1, 2, 3, 4}));
+    QCOMPARE(stack(scene.host), (QList<int> {1, 2, 3, 4}));
     scene.slider->raiseNubsieOnSlider(scene.slider->nubsie(2));
     QCOMPARE(stack(scene.host).constLast(), 2);
     scene.slider->raiseNubsieOnSlider(nullptr);
@@ -758,7 +763,7 @@ void TestMultiNubsieSlider::handlesStackAsTold()
     scene.slider->raiseNubsies();
     scene.slider->stackNubsiesOver(&cover);
     // The first stays on top, the last lies lowest, the cover right under it.
-    QCOMPARE(stack(scene.host), (QList<int>{4, 2, 3, 1}));
+    QCOMPARE(stack(scene.host), (QList<int> {4, 2, 3, 1}));
     const QObjectList& children = scene.host.children();
     QCOMPARE(children.indexOf(&cover) + 1, children.indexOf(scene.slider->nubsie(4)));
     scene.slider->stackNubsiesOver(nullptr);
@@ -788,13 +793,14 @@ void TestMultiNubsieSlider::aRivalLetsTheOneInUseGoOnTop()
     pointer.move(QPoint(9, 17));
     pointer.press();
     // The rival's handle stays where it is.
-    QCOMPARE(stack(scene.host), (QList<int>{2, 1, 7}));
+    QCOMPARE(stack(scene.host), (QList<int> {2, 1, 7}));
     pointer.release();
     delete other;
     scene.slider->raiseNubsieOverRivals();
 }
 
-// --- As a widget -------------------------------------------------------------------------------------------------
+// --- As a widget
+// -------------------------------------------------------------------------------------------------
 
 void TestMultiNubsieSlider::handlesShowAndHideWithTheSlider()
 {

@@ -203,8 +203,11 @@ void TestNubsieDrag::travelIsTwelveTenthsOfAHandleForAStep_data()
     QTest::newRow("five values") << 600 << 30 << 0 << 4 << 180.0;
     QTest::newRow("offset range") << 600 << 30 << -2 << 2 << 180.0;
     QTest::newRow("longer than the slider") << 100 << 30 << 0 << 4 << 100.0;
-    QTest::newRow("all integers")
-        << 600 << 30 << std::numeric_limits<int>::min() << std::numeric_limits<int>::max() << 600.0;
+    QTest::newRow("all integers") << 600 << 30 << std::numeric_limits<int>::min()
+                                  << std::numeric_limits<int>::max() << 600.0;
+    QTest::newRow("all integers, as large as it gets")
+        << 600 << std::numeric_limits<int>::max() << std::numeric_limits<int>::min()
+        << std::numeric_limits<int>::max() << 600.0;
     QTest::newRow("no size") << 600 << 0 << 0 << 4 << 0.0;
 }
 

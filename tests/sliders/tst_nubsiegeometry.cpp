@@ -78,8 +78,7 @@ void TestNubsieGeometry::aHandleAtRestStandsAtItsDisplayValue()
 {
     QFETCH(Qt::Orientation, orientation);
     QFETCH(double, display);
-    const QRectF bar
-        = orientation == Qt::Horizontal ? QRectF(0, 17.5, 220, 2.5) : QRectF(17.5, 0, 2.5, 220);
+    const QRectF bar = orientation == Qt::Horizontal ? QRectF(0, 17.5, 220, 2.5) : QRectF(17.5, 0, 2.5, 220);
     QTEST(position(bar, QPointF(100, 200), QSize(20, 16), display, orientation), "expected");
 }
 
@@ -107,8 +106,7 @@ void TestNubsieGeometry::aHandleInMotionStandsByItsDraggedSize()
     QFETCH(Qt::Orientation, orientation);
     QFETCH(bool, current);
     QFETCH(double, display);
-    const QRectF bar
-        = orientation == Qt::Horizontal ? QRectF(0, 17.5, 220, 2.5) : QRectF(17.5, 0, 2.5, 220);
+    const QRectF bar = orientation == Qt::Horizontal ? QRectF(0, 17.5, 220, 2.5) : QRectF(17.5, 0, 2.5, 220);
     QTEST(positionInMotion(bar, QPointF(100, 200), QSize(20, 16), QSize(31, 40), current, display, orientation),
         "expected");
 }

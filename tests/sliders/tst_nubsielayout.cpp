@@ -32,8 +32,7 @@ public:
     {
         m_sorted = sorted();
         const int n = static_cast<int>(m_sorted.size());
-        const int i
-            = static_cast<int>(std::find(m_sorted.begin(), m_sorted.end(), handle) - m_sorted.begin());
+        const int i = static_cast<int>(std::find(m_sorted.begin(), m_sorted.end(), handle) - m_sorted.begin());
         int lo = i;
         int hi = i;
 
@@ -165,15 +164,15 @@ QByteArray text(const Doubles& numbers)
 
 bool near(const Doubles& a, const Doubles& b)
 {
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(),
-        [](double x, double y) { return qAbs(x - y) < 1e-12; });
+    return std::equal(
+        a.begin(), a.end(), b.begin(), b.end(), [](double x, double y) { return qAbs(x - y) < 1e-12; });
 }
 
-#define COMPARE_NEAR(actual, expected) \
-    do { \
-        const Doubles isThis = (actual); \
-        const Doubles wanted = (expected); \
-        QVERIFY2(near(isThis, wanted), text(isThis) + "instead of " + text(wanted)); \
+#define COMPARE_NEAR(actual, expected)                                                                            \
+    do {                                                                                                          \
+        const Doubles isThis = (actual);                                                                          \
+        const Doubles wanted = (expected);                                                                        \
+        QVERIFY2(near(isThis, wanted), text(isThis) + "instead of " + text(wanted));                              \
     } while (false)
 
 int size(const std::vector<Place>& row)
@@ -202,8 +201,7 @@ std::vector<Place> randomRow(QRandomGenerator& random, int count)
 
 void sortRow(std::vector<Place>& row)
 {
-    std::stable_sort(
-        row.begin(), row.end(), [](const Place& a, const Place& b) { return a.display < b.display; });
+    std::stable_sort(row.begin(), row.end(), [](const Place& a, const Place& b) { return a.display < b.display; });
 }
 
 bool isSorted(const std::vector<Place>& row)
@@ -247,9 +245,9 @@ void TestNubsieLayout::aLengthIsTheShareOfTheScale()
 void TestNubsieLayout::handlesAreSortedAndEqualOnesKeepTheirOrder()
 {
     const std::vector<int> order = sortedByDisplay(places({0.5, 0.1, 0.5, 0.9, 0.1}, {0, 0, 0, 0, 0}));
-    QCOMPARE(order, (std::vector<int>{1, 4, 0, 2, 3}));
+    QCOMPARE(order, (std::vector<int> {1, 4, 0, 2, 3}));
     QVERIFY(sortedByDisplay({}).empty());
-    QCOMPARE(sortedByDisplay(places({qQNaN(), 0.5, qInf(), 0.1}, {0, 0, 0, 0})), (std::vector<int>{3, 1, 0, 2}));
+    QCOMPARE(sortedByDisplay(places({qQNaN(), 0.5, qInf(), 0.1}, {0, 0, 0, 0})), (std::vector<int> {3, 1, 0, 2}));
 }
 
 void TestNubsieLayout::aHandleIsPutAmongItsNeighbours_data()
@@ -262,34 +260,34 @@ void TestNubsieLayout::aHandleIsPutAmongItsNeighbours_data()
     QTest::addColumn<int>("last");
 
     // All with a length of 0.1.
-    QTest::newRow("alone at home") << Doubles{0.4} << Doubles{0.4} << 0 << Doubles{0.4} << 0 << 0;
-    QTest::newRow("alone away") << Doubles{0.4} << Doubles{0.7} << 0 << Doubles{0.7} << 0 << 0;
+    QTest::newRow("alone at home") << Doubles {0.4} << Doubles {0.4} << 0 << Doubles {0.4} << 0 << 0;
+    QTest::newRow("alone away") << Doubles {0.4} << Doubles {0.7} << 0 << Doubles {0.7} << 0 << 0;
     QTest::newRow("two are centred on their mean, from below")
-        << Doubles{0.5, 0.52} << Doubles{0.5, 0.52} << 0 << Doubles{0.46, 0.56} << 0 << 1;
+        << Doubles {0.5, 0.52} << Doubles {0.5, 0.52} << 0 << Doubles {0.46, 0.56} << 0 << 1;
     QTest::newRow("two are centred on their mean, from above")
-        << Doubles{0.5, 0.52} << Doubles{0.5, 0.52} << 1 << Doubles{0.46, 0.56} << 0 << 1;
-    QTest::newRow("three at the top") << Doubles{0.99, 0.99, 0.99} << Doubles{0.99, 0.99, 0.99} << 1
-                                      << Doubles{0.8, 0.9, 1.0} << 0 << 2;
-    QTest::newRow("two at the bottom")
-        << Doubles{0, 0.01} << Doubles{0, 0.01} << 0 << Doubles{0, 0.1} << 0 << 1;
+        << Doubles {0.5, 0.52} << Doubles {0.5, 0.52} << 1 << Doubles {0.46, 0.56} << 0 << 1;
+    QTest::newRow("three at the top") << Doubles {0.99, 0.99, 0.99} << Doubles {0.99, 0.99, 0.99} << 1
+                                      << Doubles {0.8, 0.9, 1.0} << 0 << 2;
+    QTest::newRow("two at the bottom") << Doubles {0, 0.01} << Doubles {0, 0.01} << 0 << Doubles {0, 0.1} << 0
+                                       << 1;
     QTest::newRow("two at the bottom, from above")
-        << Doubles{0, 0.01} << Doubles{0, 0.01} << 1 << Doubles{0, 0.1} << 0 << 1;
+        << Doubles {0, 0.01} << Doubles {0, 0.01} << 1 << Doubles {0, 0.1} << 0 << 1;
     QTest::newRow("neighbours out of reach stay")
-        << Doubles{0.2, 0.5, 0.8} << Doubles{0.1, 0.5, 0.9} << 1 << Doubles{0.2, 0.5, 0.8} << 1 << 1;
-    QTest::newRow("a push goes on")
-        << Doubles{0.5, 0.55, 0.62, 0.9} << Doubles{0.5, 0.5, 0.5, 0.9} << 0 << Doubles{0.4, 0.5, 0.6, 0.9} << 0 << 2;
-    QTest::newRow("and goes on downward")
-        << Doubles{0.1, 0.38, 0.45, 0.5} << Doubles{0.1, 0.5, 0.5, 0.5} << 3 << Doubles{0.1, 0.4, 0.5, 0.6} << 1 << 3;
+        << Doubles {0.2, 0.5, 0.8} << Doubles {0.1, 0.5, 0.9} << 1 << Doubles {0.2, 0.5, 0.8} << 1 << 1;
+    QTest::newRow("a push goes on") << Doubles {0.5, 0.55, 0.62, 0.9} << Doubles {0.5, 0.5, 0.5, 0.9} << 0
+                                    << Doubles {0.4, 0.5, 0.6, 0.9} << 0 << 2;
+    QTest::newRow("and goes on downward") << Doubles {0.1, 0.38, 0.45, 0.5} << Doubles {0.1, 0.5, 0.5, 0.5} << 3
+                                          << Doubles {0.1, 0.4, 0.5, 0.6} << 1 << 3;
     QTest::newRow("the way home ends at the neighbour below")
-        << Doubles{0.3, 0.6} << Doubles{0.3, 0.2} << 1 << Doubles{0.3, 0.4} << 1 << 1;
+        << Doubles {0.3, 0.6} << Doubles {0.3, 0.2} << 1 << Doubles {0.3, 0.4} << 1 << 1;
     QTest::newRow("the way home ends at the neighbour above")
-        << Doubles{0.3, 0.6} << Doubles{0.9, 0.6} << 0 << Doubles{0.5, 0.6} << 0 << 0;
+        << Doubles {0.3, 0.6} << Doubles {0.9, 0.6} << 0 << Doubles {0.5, 0.6} << 0 << 0;
     QTest::newRow("pushed down from the top into others")
-        << Doubles{0.75, 0.95, 0.98} << Doubles{0.75, 0.99, 0.99} << 1 << Doubles{0.75, 0.9, 1.0} << 1 << 2;
+        << Doubles {0.75, 0.95, 0.98} << Doubles {0.75, 0.99, 0.99} << 1 << Doubles {0.75, 0.9, 1.0} << 1 << 2;
     QTest::newRow("pushed down from the top and on")
-        << Doubles{0.85, 0.95, 0.98} << Doubles{0.95, 0.99, 0.99} << 1 << Doubles{0.8, 0.9, 1.0} << 0 << 2;
+        << Doubles {0.85, 0.95, 0.98} << Doubles {0.95, 0.99, 0.99} << 1 << Doubles {0.8, 0.9, 1.0} << 0 << 2;
     QTest::newRow("pushed up from the bottom and on")
-        << Doubles{0.02, 0.05, 0.15} << Doubles{0, 0, 0.1} << 1 << Doubles{0, 0.1, 0.2} << 0 << 2;
+        << Doubles {0.02, 0.05, 0.15} << Doubles {0, 0, 0.1} << 1 << Doubles {0, 0.1, 0.2} << 0 << 2;
 
     Doubles crowd;
     Doubles flush;
@@ -340,7 +338,7 @@ void TestNubsieLayout::handlesThatAreNearerByTheLastBitFormABlock()
     std::vector<Place> row = places({0.25, std::nextafter(0.5, 0.0)}, {0.25, 0.75});
     QCOMPARE(enqueue(row.data(), 2, 0, 0.25).last, 1);
     // Centred: the upper one takes the lower one along.
-    COMPARE_NEAR(displays(row), (Doubles{0.375, 0.625}));
+    COMPARE_NEAR(displays(row), (Doubles {0.375, 0.625}));
 }
 
 void TestNubsieLayout::blocksKeepOrderAndDistanceAndStayInside()
@@ -394,33 +392,34 @@ void TestNubsieLayout::aHandleTakenOutLetsItsNeighboursGo_data()
     QTest::addColumn<QVector<double>>("expected");
 
     // All with a length of 0.1.
-    QTest::newRow("alone") << Doubles{0.4} << Doubles{0.7} << 0 << Doubles{0.4};
-    QTest::newRow("below it comes home") << Doubles{0.46, 0.56} << Doubles{0.5, 0.52} << 1 << Doubles{0.5, 0.56};
-    QTest::newRow("above it comes home") << Doubles{0.46, 0.56} << Doubles{0.5, 0.52} << 0 << Doubles{0.46, 0.52};
+    QTest::newRow("alone") << Doubles {0.4} << Doubles {0.7} << 0 << Doubles {0.4};
+    QTest::newRow("below it comes home")
+        << Doubles {0.46, 0.56} << Doubles {0.5, 0.52} << 1 << Doubles {0.5, 0.56};
+    QTest::newRow("above it comes home")
+        << Doubles {0.46, 0.56} << Doubles {0.5, 0.52} << 0 << Doubles {0.46, 0.52};
     QTest::newRow("who is not pushed stays")
-        << Doubles{0.3, 0.5, 0.7} << Doubles{0.2, 0.5, 0.8} << 1 << Doubles{0.3, 0.5, 0.7};
+        << Doubles {0.3, 0.5, 0.7} << Doubles {0.2, 0.5, 0.8} << 1 << Doubles {0.3, 0.5, 0.7};
     QTest::newRow("both sides, room for both")
-        << Doubles{0.4, 0.5, 0.6} << Doubles{0.43, 0.5, 0.57} << 1 << Doubles{0.43, 0.5, 0.57};
+        << Doubles {0.4, 0.5, 0.6} << Doubles {0.43, 0.5, 0.57} << 1 << Doubles {0.43, 0.5, 0.57};
     // Between the two there is room for 0.1, and they want 0.09 each.
     QTest::newRow("the upper was pushed further and goes first")
-        << Doubles{0.4, 0.5, 0.6} << Doubles{0.48, 0.5, 0.51} << 1 << Doubles{0.41, 0.5, 0.51};
+        << Doubles {0.4, 0.5, 0.6} << Doubles {0.48, 0.5, 0.51} << 1 << Doubles {0.41, 0.5, 0.51};
     QTest::newRow("the lower was pushed further and goes first")
-        << Doubles{0.4, 0.5, 0.6} << Doubles{0.49, 0.5, 0.52} << 1 << Doubles{0.49, 0.5, 0.59};
+        << Doubles {0.4, 0.5, 0.6} << Doubles {0.49, 0.5, 0.52} << 1 << Doubles {0.49, 0.5, 0.59};
     QTest::newRow("equally far: the lower goes first")
-        << Doubles{0.25, 0.375, 0.5} << Doubles{0.375, 0.375, 0.375} << 1 << Doubles{0.375, 0.375, 0.475};
+        << Doubles {0.25, 0.375, 0.5} << Doubles {0.375, 0.375, 0.375} << 1 << Doubles {0.375, 0.375, 0.475};
     QTest::newRow("no further than the room")
-        << Doubles{0.4, 0.5, 0.6} << Doubles{0.3, 0.5, 0.3} << 1 << Doubles{0.4, 0.5, 0.5};
-    QTest::newRow("the row behind follows, each by no more than the one before")
-        << Doubles{0.2, 0.4, 0.5, 0.6, 0.7} << Doubles{0.2, 0.4, 0.4, 0.55, 0.6} << 2
-        << Doubles{0.2, 0.4, 0.5, 0.55, 0.65};
+        << Doubles {0.4, 0.5, 0.6} << Doubles {0.3, 0.5, 0.3} << 1 << Doubles {0.4, 0.5, 0.5};
+    QTest::newRow("the row behind follows, each by no more than the one before") << Doubles {
+        0.2, 0.4, 0.5, 0.6, 0.7} << Doubles {0.2, 0.4, 0.4, 0.55, 0.6} << 2 << Doubles {0.2, 0.4, 0.5, 0.55, 0.65};
     QTest::newRow("the row below follows")
-        << Doubles{0.3, 0.4, 0.5, 0.6} << Doubles{0.4, 0.45, 0.6, 0.6} << 2 << Doubles{0.35, 0.45, 0.5, 0.6};
+        << Doubles {0.3, 0.4, 0.5, 0.6} << Doubles {0.4, 0.45, 0.6, 0.6} << 2 << Doubles {0.35, 0.45, 0.5, 0.6};
     QTest::newRow("one that is home holds those behind it")
-        << Doubles{0.4, 0.5, 0.6, 0.7} << Doubles{0.4, 0.5, 0.6, 0.65} << 1 << Doubles{0.4, 0.5, 0.6, 0.7};
+        << Doubles {0.4, 0.5, 0.6, 0.7} << Doubles {0.4, 0.5, 0.6, 0.65} << 1 << Doubles {0.4, 0.5, 0.6, 0.7};
     QTest::newRow("at the bottom the room is what is above 0")
-        << Doubles{0.0, 0.1} << Doubles{0.0, -1.0} << 0 << Doubles{0.0, 0.0};
+        << Doubles {0.0, 0.1} << Doubles {0.0, -1.0} << 0 << Doubles {0.0, 0.0};
     QTest::newRow("at the top the room is what is below 1")
-        << Doubles{0.9, 1.0} << Doubles{2.0, 1.0} << 1 << Doubles{1.0, 1.0};
+        << Doubles {0.9, 1.0} << Doubles {2.0, 1.0} << 1 << Doubles {1.0, 1.0};
 }
 
 void TestNubsieLayout::aHandleTakenOutLetsItsNeighboursGo()
@@ -445,13 +444,13 @@ void TestNubsieLayout::pullingInStopsAtTheFirstThatIsHome()
     Block block = pullInThoseAbove(row.data(), 5, 0, 0.05);
     QCOMPARE(block.first, 1);
     QCOMPARE(block.last, 2);
-    COMPARE_NEAR(displays(row), (Doubles{0.1, 0.25, 0.45, 0.7, 0.9}));
+    COMPARE_NEAR(displays(row), (Doubles {0.1, 0.25, 0.45, 0.7, 0.9}));
 
     row = places({0.1, 0.3, 0.5, 0.7, 0.9}, {0.2, 0.3, 0.52, 0.8, 0.9});
     block = pullInThoseBelow(row.data(), 4, 1.0);
     QCOMPARE(block.first, 2);
     QCOMPARE(block.last, 3);
-    COMPARE_NEAR(displays(row), (Doubles{0.1, 0.3, 0.52, 0.8, 0.9}));
+    COMPARE_NEAR(displays(row), (Doubles {0.1, 0.3, 0.52, 0.8, 0.9}));
 
     block = pullInThoseAbove(row.data(), 5, 4, 1.0);
     QVERIFY(block.last < block.first);
@@ -471,8 +470,8 @@ void TestNubsieLayout::takingOutKeepsTheOrderAndOvershootsNothing()
         const std::vector<Place> before = row;
         const int index = random.bounded(count);
         const Drift drift = dequeue(row.data(), count, index, length);
-        const QByteArray what = "round " + QByteArray::number(round) + ": " + text(displays(before)) + "-> "
-            + text(displays(row));
+        const QByteArray what
+            = "round " + QByteArray::number(round) + ": " + text(displays(before)) + "-> " + text(displays(row));
 
         for (int k = 0; k < count; ++k) {
             const Place& now = row[static_cast<std::size_t>(k)];
@@ -504,16 +503,15 @@ void TestNubsieLayout::allHandlesInTurn_data()
     QTest::addColumn<QVector<double>>("expected");
 
     // Handles of 20 pixels on a bar of 220; drawn at their true values before.
-    QTest::newRow("none") << Doubles{} << Doubles{};
-    QTest::newRow("two in the middle") << Doubles{0.5, 0.52} << Doubles{0.46, 0.56};
-    QTest::newRow("in the other order") << Doubles{0.52, 0.5} << Doubles{0.56, 0.46};
-    QTest::newRow("three at the top") << Doubles{0.99, 0.99, 0.99} << Doubles{0.8, 0.9, 1.0};
-    QTest::newRow("two at the bottom") << Doubles{0.0, 0.01} << Doubles{0.0, 0.1};
-    QTest::newRow("far apart") << Doubles{0.9, 0.1, 0.5} << Doubles{0.9, 0.1, 0.5};
-    QTest::newRow("two pairs") << Doubles{0.2, 0.7, 0.22, 0.72} << Doubles{0.16, 0.66, 0.26, 0.76};
-    QTest::newRow("twelve at the top")
-        << Doubles(12, 0.95)
-        << Doubles{-0.1, 0.0, 0.1, 0.2, 0.3, 0.4, 0.5, 0.6, 0.7, 0.8, 0.9, 1.0};
+    QTest::newRow("none") << Doubles {} << Doubles {};
+    QTest::newRow("two in the middle") << Doubles {0.5, 0.52} << Doubles {0.46, 0.56};
+    QTest::newRow("in the other order") << Doubles {0.52, 0.5} << Doubles {0.56, 0.46};
+    QTest::newRow("three at the top") << Doubles {0.99, 0.99, 0.99} << Doubles {0.8, 0.9, 1.0};
+    QTest::newRow("two at the bottom") << Doubles {0.0, 0.01} << Doubles {0.0, 0.1};
+    QTest::newRow("far apart") << Doubles {0.9, 0.1, 0.5} << Doubles {0.9, 0.1, 0.5};
+    QTest::newRow("two pairs") << Doubles {0.2, 0.7, 0.22, 0.72} << Doubles {0.16, 0.66, 0.26, 0.76};
+    QTest::newRow("twelve at the top") << Doubles(12, 0.95)
+                                       << Doubles {-0.1, 0.0, 0.1, 0.2, 0.3, 0.4, 0.5, 0.6, 0.7, 0.8, 0.9, 1.0};
 }
 
 void TestNubsieLayout::allHandlesInTurn()
