@@ -17,6 +17,7 @@
 #include "pages/OverlaysPage.h"
 #include "pages/PasswordPage.h"
 #include "pages/PhoneListPage.h"
+#include "pages/PopoverRowsPage.h"
 #include "pages/PopoversPage.h"
 #include "pages/PanelsPage.h"
 #include "pages/PagesPage.h"
@@ -118,6 +119,12 @@ const QVector<PageEntry>& pages()
                            "A popover points at what it belongs to, keeps inside the window and closes with a click "
                            "beside it. Click a number."),
          &make<PopoversPage>},
+        {"popover-rows", QT_TRANSLATE_NOOP("gallery::PageList", "Popovers"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Popover rows"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "Every row that a popover can hold: texts, choices, values and submenus. What is "
+                           "performed stands in the log, with its value and flags."),
+         &make<PopoverRowsPage>},
         {"panels", QT_TRANSLATE_NOOP("gallery::PageList", "Views"), QT_TRANSLATE_NOOP("gallery::PageList", "Panels"),
          QT_TRANSLATE_NOOP("gallery::PageList",
                            "FadeView is a strip at the edge of a view that slides open and can take the full "

@@ -10,6 +10,7 @@
 
 #include "input/MouseEvent.h"
 #include "input/MouseGesture.h"
+#include "popover/PopoverFlags.h"
 
 namespace gallery
 {
@@ -44,7 +45,21 @@ QString argumentText(const QByteArray& type, int id, const void* data)
     if (id == QMetaType::UnknownType) {
         return QString::fromLatin1(type);
     }
-    const QVariant value(id, data);
+    if (type.endsWith("EItemPerformedFlags")) {
+        return QString::number(int(*static_cast<const vx::PopoverWidget::EItemPerformedFlags*>(data)));
+    }
+    const QVariant value = id == QMetaType::QVariant ? *static_cast<const QVariant*>(data) : QVariant(id, data);
+    if (!value.isValid()) {
+        return QStringLiteral("null");
+    }
+    if (value.type() == QVariant::List) {
+        QStringList texts;
+        const QVariantList list = value.toList();
+        for (const QVariant& entry : list) {
+            texts << entry.toString();
+        }
+        return QLatin1Char('(') + texts.join(QStringLiteral(", ")) + QLatin1Char(')');
+    }
     if (value.type() == QVariant::String) {
         return QLatin1Char('"') + value.toString() + QLatin1Char('"');
     }

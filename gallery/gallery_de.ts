@@ -1137,6 +1137,14 @@
         <source>iOSListWidget has rows that can be edited, deleted and put in another order.</source>
         <translation>iOSListWidget hat Zeilen, die sich bearbeiten, löschen und umordnen lassen.</translation>
     </message>
+    <message>
+        <source>Popover rows</source>
+        <translation>Zeilen von Popovern</translation>
+    </message>
+    <message>
+        <source>Every row that a popover can hold: texts, choices, values and submenus. What is performed stands in the log, with its value and flags.</source>
+        <translation>Jede Zeile, die ein Popover enthalten kann: Texte, Auswahl, Werte und Untermenüs. Was ausgeführt wird, steht mit Wert und Flags im Protokoll.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>
@@ -1380,6 +1388,193 @@
     <message>
         <source>While you edit: the red sign brings out a button that deletes the row, a row is dragged to another place, and its name can be changed.</source>
         <translation>Beim Bearbeiten: Das rote Zeichen bringt einen Knopf hervor, der die Zeile löscht, eine Zeile lässt sich an eine andere Stelle ziehen, und ihr Name ist änderbar.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PopoverRowsPage</name>
+    <message>
+        <source>Texts</source>
+        <translation>Texte</translation>
+    </message>
+    <message>
+        <source>Choices</source>
+        <translation>Auswahl</translation>
+    </message>
+    <message>
+        <source>Values</source>
+        <translation>Werte</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Einstellungen</translation>
+    </message>
+    <message>
+        <source>I am an administrator</source>
+        <translation>Ich bin Administrator</translation>
+    </message>
+    <message>
+        <source>Rows are busy</source>
+        <translation>Zeilen sind beschäftigt</translation>
+    </message>
+    <message>
+        <source>A right click on a row with a value offers to set it back.</source>
+        <translation>Ein Rechtsklick auf eine Zeile mit einem Wert bietet an, ihn zurückzusetzen.</translation>
+    </message>
+    <message>
+        <source>Brightness</source>
+        <translation>Helligkeit</translation>
+    </message>
+    <message>
+        <source>Set back</source>
+        <translation>Zurücksetzen</translation>
+    </message>
+    <message>
+        <source>Search cameras</source>
+        <translation>Kameras suchen</translation>
+    </message>
+    <message>
+        <source>Text over as many lines as it takes, with &lt;a href=&quot;https://www.qt.io&quot;&gt;links&lt;/a&gt;.</source>
+        <translation>Text über so viele Zeilen wie nötig, mit &lt;a href=&quot;https://www.qt.io&quot;&gt;Verweisen&lt;/a&gt;.</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Name</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Tor</translation>
+    </message>
+    <message>
+        <source>Group</source>
+        <translation>Gruppe</translation>
+    </message>
+    <message>
+        <source>All groups</source>
+        <translation>Alle Gruppen</translation>
+    </message>
+    <message>
+        <source>Car park</source>
+        <translation>Parkplatz</translation>
+    </message>
+    <message>
+        <source>Place</source>
+        <translation>Ort</translation>
+    </message>
+    <message>
+        <source>several values</source>
+        <translation>mehrere Werte</translation>
+    </message>
+    <message>
+        <source>Take a picture</source>
+        <translation>Bild aufnehmen</translation>
+    </message>
+    <message>
+        <source>Ctrl+P</source>
+        <translation>Strg+P</translation>
+    </message>
+    <message>
+        <source>Click or double click</source>
+        <translation>Klick oder Doppelklick</translation>
+    </message>
+    <message>
+        <source>Recording</source>
+        <translation>Aufzeichnung</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>Ton</translation>
+    </message>
+    <message>
+        <source>Events of all inputs</source>
+        <translation>Ereignisse aller Eingänge</translation>
+    </message>
+    <message>
+        <source>Stream</source>
+        <translation>Strom</translation>
+    </message>
+    <message>
+        <source>High</source>
+        <translation>Hoch</translation>
+    </message>
+    <message>
+        <source>Medium</source>
+        <translation>Mittel</translation>
+    </message>
+    <message>
+        <source>Low</source>
+        <translation>Niedrig</translation>
+    </message>
+    <message>
+        <source>Lamp</source>
+        <translation>Lampe</translation>
+    </message>
+    <message>
+        <source>level %1</source>
+        <translation>Stufe %1</translation>
+    </message>
+    <message>
+        <source>Always</source>
+        <translation>Immer</translation>
+    </message>
+    <message>
+        <source>On motion</source>
+        <translation>Bei Bewegung</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Nie</translation>
+    </message>
+    <message>
+        <source>Frames a second</source>
+        <translation>Bilder pro Sekunde</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>Von</translation>
+    </message>
+    <message>
+        <source>Every</source>
+        <translation>Alle</translation>
+    </message>
+    <message>
+        <source>s</source>
+        <translation>s</translation>
+    </message>
+    <message>
+        <source>min</source>
+        <translation>min</translation>
+    </message>
+    <message>
+        <source>At most</source>
+        <translation>Max.</translation>
+    </message>
+    <message>
+        <source>MB</source>
+        <translation>MB</translation>
+    </message>
+    <message>
+        <source>Quality</source>
+        <translation>Qualität</translation>
+    </message>
+    <message>
+        <source>Storage</source>
+        <translation>Speicher</translation>
+    </message>
+    <message>
+        <source>Overwrite old recordings</source>
+        <translation>Alte Aufzeichnungen überschreiben</translation>
+    </message>
+    <message>
+        <source>Days to keep</source>
+        <translation>Tage Vorhaltezeit</translation>
+    </message>
+    <message>
+        <source>Show the time</source>
+        <translation>Zeit anzeigen</translation>
+    </message>
+    <message>
+        <source>GB</source>
+        <translation>GB</translation>
     </message>
 </context>
 <context>

@@ -1137,6 +1137,14 @@
         <source>iOSListWidget has rows that can be edited, deleted and put in another order.</source>
         <translation>iOSListWidget a des lignes que l’on peut modifier, supprimer et réordonner.</translation>
     </message>
+    <message>
+        <source>Popover rows</source>
+        <translation>Lignes de popovers</translation>
+    </message>
+    <message>
+        <source>Every row that a popover can hold: texts, choices, values and submenus. What is performed stands in the log, with its value and flags.</source>
+        <translation>Chaque ligne qu&apos;un popover peut contenir : textes, choix, valeurs et sous-menus. Ce qui est exécuté figure dans le journal, avec sa valeur et ses indicateurs.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>
@@ -1380,6 +1388,193 @@
     <message>
         <source>While you edit: the red sign brings out a button that deletes the row, a row is dragged to another place, and its name can be changed.</source>
         <translation>Pendant la modification : le signe rouge fait apparaître un bouton qui supprime la ligne, une ligne se tire à une autre place, et son nom peut être changé.</translation>
+    </message>
+</context>
+<context>
+    <name>gallery::PopoverRowsPage</name>
+    <message>
+        <source>Texts</source>
+        <translation>Textes</translation>
+    </message>
+    <message>
+        <source>Choices</source>
+        <translation>Choix</translation>
+    </message>
+    <message>
+        <source>Values</source>
+        <translation>Valeurs</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Paramètres</translation>
+    </message>
+    <message>
+        <source>I am an administrator</source>
+        <translation>Je suis administrateur</translation>
+    </message>
+    <message>
+        <source>Rows are busy</source>
+        <translation>Lignes occupées</translation>
+    </message>
+    <message>
+        <source>A right click on a row with a value offers to set it back.</source>
+        <translation>Un clic droit sur une ligne avec une valeur propose de la rétablir.</translation>
+    </message>
+    <message>
+        <source>Brightness</source>
+        <translation>Luminosité</translation>
+    </message>
+    <message>
+        <source>Set back</source>
+        <translation>Rétablir</translation>
+    </message>
+    <message>
+        <source>Search cameras</source>
+        <translation>Rechercher des caméras</translation>
+    </message>
+    <message>
+        <source>Text over as many lines as it takes, with &lt;a href=&quot;https://www.qt.io&quot;&gt;links&lt;/a&gt;.</source>
+        <translation>Du texte sur autant de lignes qu&apos;il faut, avec des &lt;a href=&quot;https://www.qt.io&quot;&gt;liens&lt;/a&gt;.</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Nom</translation>
+    </message>
+    <message>
+        <source>Gate</source>
+        <translation>Portail</translation>
+    </message>
+    <message>
+        <source>Group</source>
+        <translation>Groupe</translation>
+    </message>
+    <message>
+        <source>All groups</source>
+        <translation>Tous les groupes</translation>
+    </message>
+    <message>
+        <source>Car park</source>
+        <translation>Parking</translation>
+    </message>
+    <message>
+        <source>Place</source>
+        <translation>Lieu</translation>
+    </message>
+    <message>
+        <source>several values</source>
+        <translation>plusieurs valeurs</translation>
+    </message>
+    <message>
+        <source>Take a picture</source>
+        <translation>Prendre une image</translation>
+    </message>
+    <message>
+        <source>Ctrl+P</source>
+        <translation>Ctrl+P</translation>
+    </message>
+    <message>
+        <source>Click or double click</source>
+        <translation>Clic ou double clic</translation>
+    </message>
+    <message>
+        <source>Recording</source>
+        <translation>Enregistrement</translation>
+    </message>
+    <message>
+        <source>Audio</source>
+        <translation>Son</translation>
+    </message>
+    <message>
+        <source>Events of all inputs</source>
+        <translation>Événements de toutes les entrées</translation>
+    </message>
+    <message>
+        <source>Stream</source>
+        <translation>Flux</translation>
+    </message>
+    <message>
+        <source>High</source>
+        <translation>Élevée</translation>
+    </message>
+    <message>
+        <source>Medium</source>
+        <translation>Moyenne</translation>
+    </message>
+    <message>
+        <source>Low</source>
+        <translation>Basse</translation>
+    </message>
+    <message>
+        <source>Lamp</source>
+        <translation>Lampe</translation>
+    </message>
+    <message>
+        <source>level %1</source>
+        <translation>niveau %1</translation>
+    </message>
+    <message>
+        <source>Always</source>
+        <translation>Toujours</translation>
+    </message>
+    <message>
+        <source>On motion</source>
+        <translation>Sur mouvement</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Jamais</translation>
+    </message>
+    <message>
+        <source>Frames a second</source>
+        <translation>Images par seconde</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>Du</translation>
+    </message>
+    <message>
+        <source>Every</source>
+        <translation>Toutes les</translation>
+    </message>
+    <message>
+        <source>s</source>
+        <translation>s</translation>
+    </message>
+    <message>
+        <source>min</source>
+        <translation>min</translation>
+    </message>
+    <message>
+        <source>At most</source>
+        <translation>Max.</translation>
+    </message>
+    <message>
+        <source>MB</source>
+        <translation>Mo</translation>
+    </message>
+    <message>
+        <source>Quality</source>
+        <translation>Qualité</translation>
+    </message>
+    <message>
+        <source>Storage</source>
+        <translation>Stockage</translation>
+    </message>
+    <message>
+        <source>Overwrite old recordings</source>
+        <translation>Écraser les anciens enregistrements</translation>
+    </message>
+    <message>
+        <source>Days to keep</source>
+        <translation>Jours de conservation</translation>
+    </message>
+    <message>
+        <source>Show the time</source>
+        <translation>Afficher l&apos;heure</translation>
+    </message>
+    <message>
+        <source>GB</source>
+        <translation>Go</translation>
     </message>
 </context>
 <context>

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Each button opens a popover with rows of one family. The popovers let the mouse through beside them, so that several
-// can stand open.
+// Each button opens a popover with rows of one family; a click beside it closes it.
 #include "PopoverRowsPage.h"
 
 #include <QtCore/QDateTime>
@@ -45,7 +44,7 @@ using rows::Balloon;
 using rows::Manager;
 
 const rows::EItemFlags s_usual = rows::eifText | rows::eifControl;
-constexpr int s_width = 250;
+constexpr int s_width = 222;
 
 QString name(const char* text)
 {
@@ -111,13 +110,7 @@ QWidget* PopoverRowsPage::makeSettings()
     administrator->setChecked(true);
     connect(administrator, &QCheckBox::toggled, this, [this](bool on) { m_rights->m_administrator = on; });
     m_busy = new QCheckBox(tr("Rows are busy"));
-    connect(m_busy, &QCheckBox::toggled, this, [this](bool on) {
-        for (const QPointer<Item>& row : qAsConst(m_rows)) {
-            if (row) {
-                row->setBusy(on, true);
-            }
-        }
-    });
+    connect(m_busy, &QCheckBox::toggled, this, &PopoverRowsPage::setBusy);
     auto* layout = new QHBoxLayout(box);
     layout->setContentsMargins(16, 10, 16, 10);
     layout->setSpacing(24);
@@ -126,6 +119,15 @@ QWidget* PopoverRowsPage::makeSettings()
     layout->addWidget(label(tr("A right click on a row with a value offers to set it back."), "hint"));
     layout->addStretch(1);
     return box;
+}
+
+void PopoverRowsPage::setBusy(bool busy)
+{
+    for (const QPointer<Item>& row : qAsConst(m_rows)) {
+        if (row) {
+            row->setBusy(busy, true);
+        }
+    }
 }
 
 void PopoverRowsPage::open(QPushButton* button, Container* (PopoverRowsPage::*fill)())
@@ -141,7 +143,10 @@ void PopoverRowsPage::open(QPushButton* button, Container* (PopoverRowsPage::*fi
         button, button->text(), QString(), Balloon::EArrowDirections(Balloon::eadTop), QSizeF(),
         Balloon::ESizeConstraints());
     controller->setContainer((this->*fill)(), Balloon::ebfTitle | Balloon::ebfClose);
-    controller->setActive(true, Controller::epsBalloon | Controller::epsNoFade | Controller::epsMouseTransparent, false);
+    controller->setActive(true, Controller::epsBalloon | Controller::epsNoFade, false);
+    if (m_busy->isChecked()) {
+        setBusy(true);
+    }
     if (m_slider && fill == &PopoverRowsPage::values) {
         addHandle();
     }
@@ -182,7 +187,7 @@ PopoverRowsPage::Container* PopoverRowsPage::column()
 PopoverRowsPage::Item* PopoverRowsPage::add(Container* container, Item* row, const QString& rowName)
 {
     row->setAdminOnly(true);
-    row->setMinimumWidth(s_width);
+    row->setFixedWidth(s_width);
     container->addItem(row, rows::EContainerFlags());
     watch(row, rowName, {name("layoutChanged")});
     if (row->layout() && row->itemFlags().testFlag(rows::eifControl)) {
@@ -269,7 +274,7 @@ PopoverRowsPage::Container* PopoverRowsPage::values()
     auto* seconds = new rows::UnitValueItem(tr("Every"), {tr("s"), tr("min")}, name("every"), group, 24, s_usual, nullptr);
     seconds->valueItem()->setValue(10);
     add(box, seconds, name("every"));
-    auto* count = new rows::UnitValueItem(tr("At most"), {tr("pictures"), tr("MB")}, name("most"), group, 25, s_usual,
+    auto* count = new rows::UnitValueItem(tr("At most"), {tr("MB"), tr("GB")}, name("most"), group, 25, s_usual,
         nullptr);
     count->valueItem()->setValue(50);
     add(box, count, name("most"));
@@ -302,9 +307,16 @@ PopoverRowsPage::Container* PopoverRowsPage::settings()
 
 void PopoverRowsPage::rehearse(Hand& hand)
 {
-    for (int i : {0, 1, 2}) {
-        hand.click(m_buttons.at(i), m_buttons.at(i)->rect().center()).wait(120);
+    open(m_buttons.at(0), &PopoverRowsPage::texts);
+    open(m_buttons.at(2), &PopoverRowsPage::values);
+    // The last one opened is the one that takes the mouse.
+    open(m_buttons.at(1), &PopoverRowsPage::choices);
+    const Container* const chosen = m_open.at(1)->getContainer();
+    hand.wait(200);
+    for (int id : {12, 13}) {
+        Item* const row = chosen->getItem(id);
+        hand.click(row, QPoint(60, row->sizeHint().height() / 2)).wait(80);
     }
-    hand.wait(300);
+    hand.wait(200);
 }
 }

@@ -47,6 +47,7 @@ private:
     QPushButton* addButton(const QString& text, Container* (PopoverRowsPage::*fill)());
     QWidget* makeSettings();
     void open(QPushButton* button, Container* (PopoverRowsPage::*fill)());
+    void setBusy(bool busy);
     void addHandle();
     /// Adds a row that takes the right, and is watched.
     Item* add(Container* container, Item* row, const QString& name);

@@ -26,6 +26,10 @@ LabelItem::LabelItem(const QString& text, const QString& additionalText, const Q
         m_label->setAlignment(Qt::AlignCenter);
     }
     (m_leftLayout ? m_leftLayout : m_mainLayout)->addWidget(m_label);
+    if (m_leftLayout && !flags.testFlag(eifCentered)) {
+        // Aligned, the layout would keep to its size hint, and the text could not wrap to the width of the row.
+        m_mainLayout->setAlignment(m_leftLayout, Qt::Alignment());
+    }
     m_lastElement = m_label;
 }
 

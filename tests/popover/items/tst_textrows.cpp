@@ -40,6 +40,16 @@ private Q_SLOTS:
         QVERIFY(bare.value().isNull());
     }
 
+    void theTextWrapsToTheWidthOfTheRow()
+    {
+        rowtest::Host<LabelItem> host(new LabelItem(
+            QStringLiteral("a text of so many words that one line does not hold them, nor do two of them, by far"),
+            QString(), QString(), 3, eifText, nullptr));
+        QCoreApplication::processEvents();
+        QCOMPARE(host.row->label()->width(), 250);
+        QVERIFY(host.row->heightForWidth(250) > host.row->heightForWidth(400));
+    }
+
     void theTextOfALabelRow()
     {
         LabelItem row(QStringLiteral("a"), QString(), QString(), 3, eifText, nullptr);
