@@ -77,6 +77,7 @@ void PhoneListPage::addDevice(const QString& name, const QString& state)
     auto* shown = new QLabel(name);
     shown->setMargin(10);
     auto* field = new QLineEdit(name);
+    field->setFrame(false);
     connect(field, &QLineEdit::textChanged, shown, &QLabel::setText);
     auto* word = label(state, "hint");
     word->setMargin(10);
