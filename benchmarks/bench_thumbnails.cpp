@@ -10,6 +10,7 @@
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QHeaderView>
 #include <QtWidgets/QScrollBar>
+#include <QtWidgets/QStyledItemDelegate>
 #include <QtWidgets/QTableView>
 
 #include "models/FlexibleTableModel.h"
@@ -198,10 +199,29 @@ void scrollBare(benchmark::State& state)
 }
 BENCHMARK(scrollBare)->Unit(benchmark::kMicrosecond);
 
-void scrollWall(benchmark::State& state)
+/// A delegate that does nothing but blit: what the item view costs by itself.
+class BareDelegate : public QStyledItemDelegate
+{
+public:
+    BareDelegate()
+    {
+        for (int i = 0; i < 64; ++i) {
+            m_ready << QPixmap::fromImage(makePicture(i, c_cell));
+        }
+    }
+
+    void paint(QPainter* painter, const QStyleOptionViewItem& option, const QModelIndex& index) const override
+    {
+        painter->drawPixmap(option.rect.topLeft(), m_ready.at((index.row() * c_columns + index.column()) % 64));
+    }
+
+private:
+    QVector<QPixmap> m_ready;
+};
+
+void scrollTable(benchmark::State& state, QAbstractItemDelegate& delegate)
 {
     Cells model(int(state.range(0)));
-    vx::TableViewDelegate delegate(nullptr);
     QTableView view;
     view.setFrameShape(QFrame::NoFrame);
     view.setShowGrid(false);
@@ -223,7 +243,20 @@ void scrollWall(benchmark::State& state)
         QApplication::processEvents();
     }
 }
+
+void scrollWall(benchmark::State& state)
+{
+    vx::TableViewDelegate delegate(nullptr);
+    scrollTable(state, delegate);
+}
 BENCHMARK(scrollWall)->Arg(1000)->Arg(10000)->Arg(100000)->Unit(benchmark::kMicrosecond);
+
+void scrollWallBareDelegate(benchmark::State& state)
+{
+    BareDelegate delegate;
+    scrollTable(state, delegate);
+}
+BENCHMARK(scrollWallBareDelegate)->Arg(1000)->Arg(100000)->Unit(benchmark::kMicrosecond);
 }
 
 int main(int argc, char* argv[])

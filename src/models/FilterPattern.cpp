@@ -2,6 +2,8 @@
 // Recognises literal patterns and compares them without QRegExp.
 #include "models/FilterPattern.h"
 
+#include "models/FilterAutomaton.h"
+
 namespace vx
 {
 namespace
@@ -37,6 +39,7 @@ FilterPattern::FilterPattern(const QRegExp& regExp)
     , m_literal(isLiteral(regExp))
 {
     if (!m_literal) {
+        m_automaton = FilterAutomaton::create(regExp);
         return;
     }
     m_text = regExp.pattern();
@@ -73,6 +76,9 @@ bool FilterPattern::isLiteral(const QRegExp& regExp)
 
 bool FilterPattern::matchesWhole(const QString& text) const
 {
+    if (m_automaton != nullptr) {
+        return m_automaton->matchesWhole(text);
+    }
     if (!m_literal) {
         return m_regExp.exactMatch(text);
     }

@@ -40,18 +40,21 @@ struct CaptionKey
 {
     QString text;
     QSize extent; // logical pixels
+    QRect bar;    // logical pixels, seen from the upper left of the text
+    QRgb color;   // of the bar; transparent for a text without one
     int size;
     Qt::LayoutDirection direction;
 
     bool operator==(const CaptionKey& other) const
     {
-        return extent == other.extent && size == other.size && direction == other.direction && text == other.text;
+        return extent == other.extent && bar == other.bar && color == other.color && size == other.size
+            && direction == other.direction && text == other.text;
     }
 };
 
 uint qHash(const CaptionKey& key, uint seed)
 {
-    return ::qHash(key.text, seed) ^ uint(key.extent.width() * 31 + key.extent.height() * 7 + key.size);
+    return ::qHash(key.text, seed) ^ uint(key.extent.width() * 31 + key.extent.height() * 7 + key.size) ^ key.color;
 }
 
 /// A text at the size and in the words in which it fits.
@@ -59,7 +62,7 @@ struct Caption
 {
     QFont font;
     QString text;
-    QPixmap glyphs; // the text alone, white on nothing
+    QPixmap picture; // bar and text in one
 };
 }
 
@@ -119,17 +122,18 @@ int kibibytes(const QSize& size)
     return int(qMin<qint64>(qint64(size.width()) * size.height() * 4 / 1024 + 1, INT_MAX));
 }
 
-/// Laying out glyphs takes longer than all the rest of a cell, so that the drawn text is kept, too.
-void bakeGlyphs(Caption& caption, const CaptionKey& key, const QSize& size, qreal ratio)
+/// Laying out glyphs takes longer than all the rest of a cell, so that the drawn text is kept, too, and its bar with
+/// it: one picture to blend instead of two.
+void bakeCaption(Caption& caption, const CaptionKey& key, const QSize& size, qreal ratio)
 {
-    caption.glyphs = QPixmap(size);
-    caption.glyphs.setDevicePixelRatio(ratio);
-    caption.glyphs.fill(Qt::transparent);
-    QPainter painter(&caption.glyphs);
+    caption.picture = QPixmap(size);
+    caption.picture.setDevicePixelRatio(ratio);
+    caption.picture.fill(QColor::fromRgba(key.color));
+    QPainter painter(&caption.picture);
     painter.setLayoutDirection(key.direction);
     painter.setFont(caption.font);
     painter.setPen(Qt::white);
-    painter.drawText(QRect(QPoint(0, 0), key.extent), c_captionAlignment, caption.text);
+    painter.drawText(QRect(-key.bar.topLeft(), key.extent), c_captionAlignment, caption.text);
 }
 }
 
@@ -217,32 +221,41 @@ void TableViewDelegate::paintCaption(QRect& background, QRect& text, const QMode
     if (words.isEmpty()) {
         return;
     }
-    painter->fillRect(background, color);
     const int size = getFontSize(text.height());
     const bool selected = option.state.testFlag(QStyle::State_Selected);
     painter->setPen(Qt::white);
     painter->setBrush(
         option.palette.brush(QPalette::Active, selected ? QPalette::HighlightedText : QPalette::ButtonText));
+    const QRect filled = background; // may be the same object as text
     text.adjust(4, 0, -4, 0);
 
-    const CaptionKey key {words, text.size(), size, painter->layoutDirection()};
+    // A bar and a text blended one after the other are the same as both in one only where nothing else comes in.
+    const bool plain = painter->compositionMode() == QPainter::CompositionMode_SourceOver;
+    const bool together = plain && painter->opacity() >= 1 && filled.contains(text);
+    const QRect bar = together ? filled : text;
+    const CaptionKey key {words, text.size(), bar.translated(-text.topLeft()),
+        together ? color.rgba() : qRgba(0, 0, 0, 0), size, painter->layoutDirection()};
     Caption* caption = m_cache->captions.object(key);
-    const QSize pixels = blitSize(painter, text);
+    const QSize pixels = blitSize(painter, bar);
     const int cost = kibibytes(pixels);
+    const bool kept = plain && !pixels.isEmpty() && cost <= c_captionCacheKibibytes / 8;
+    if (!kept || !together) {
+        painter->fillRect(filled, color);
+    }
     if (caption == nullptr) {
         caption = makeCaption(key);
         m_cache->captions.insert(key, caption, qBound(1, cost, c_captionCacheKibibytes / 8));
     }
     painter->setFont(caption->font);
-    if (pixels.isEmpty() || cost > c_captionCacheKibibytes / 8) {
+    if (!kept) {
         painter->drawText(text, c_captionAlignment, caption->text);
         return;
     }
     const qreal ratio = painter->device()->devicePixelRatioF();
-    if (caption->glyphs.size() != pixels || caption->glyphs.devicePixelRatioF() != ratio) {
-        bakeGlyphs(*caption, key, pixels, ratio);
+    if (caption->picture.size() != pixels || caption->picture.devicePixelRatioF() != ratio) {
+        bakeCaption(*caption, key, pixels, ratio);
     }
-    painter->drawPixmap(text.topLeft(), caption->glyphs);
+    painter->drawPixmap(bar.topLeft(), caption->picture);
 }
 
 void TableViewDelegate::drawPicture(QPainter* painter, const QRect& rect, const QImage& image) const

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The prepared pattern gives the results of QRegExp, for every pattern.
+#include <functional>
 #include <random>
 
 #include <QtTest/QtTest>
@@ -23,6 +24,12 @@ private Q_SLOTS:
     void everyCharacterAgainstItsCases();
     void randomPatternsAgreeWithQRegExp();
     void anEmptyPatternIsNotLiteral();
+    void commonExpressionsAreRecognised_data();
+    void commonExpressionsAreRecognised();
+    void aMinimalPatternIsLeftToQRegExp();
+    void placesEndAtSixtyFour();
+    void everyCharacterAgainstTheClasses();
+    void randomExpressionsAgreeWithQRegExp();
 };
 
 static QString describe(const QRegExp& regExp, const QString& text)
@@ -195,6 +202,125 @@ void TestFilterPattern::anEmptyPatternIsNotLiteral()
     QVERIFY(!FilterPattern::isLiteral(empty));
     QCOMPARE(FilterPattern(empty).isFoundIn(QStringLiteral("x")), empty.indexIn(QStringLiteral("x")) >= 0);
     QCOMPARE(FilterPattern().matchesWhole(QString()), empty.exactMatch(QString()));
+}
+
+void TestFilterPattern::commonExpressionsAreRecognised_data()
+{
+    QTest::addColumn<QString>("text");
+    QTest::addColumn<int>("syntax");
+    QTest::addColumn<bool>("recognised");
+    const int expression = QRegExp::RegExp;
+    const int wildcard = QRegExp::Wildcard;
+    for (const char* text : {"on(line|hold)", "Camera .*", "a+b?c*", "10\\.0\\.\\d+\\.\\d+", "^on(line)?$", "[a-f0-9]+",
+             "[^x]*", "(ab|c(d|e)+)*f", "\\w+\\s\\S+", "a|b|c", "^a\\(b\\)$"}) {
+        QTest::newRow(text) << QString::fromLatin1(text) << expression << true;
+    }
+    for (const char* text : {"a**", "a{2}", "(?=a)b", "(a)\\1", "a|", "()", "(a", "a)", "^a|b$", "[a", "[]", "[.]", "\\b",
+             "\\x41", "a^b", "\\", "*", "a\\\\$", "^*", "[b-a]"}) {
+        QTest::newRow(text) << QString::fromLatin1(text) << expression << false;
+    }
+    QTest::newRow("newer") << QStringLiteral("on.*") << int(QRegExp::RegExp2) << true;
+    QTest::newRow("wild") << QStringLiteral("cam*(1?)+") << wildcard << true;
+    QTest::newRow("wild set") << QStringLiteral("cam[12]*") << wildcard << false;
+    QTest::newRow("unix") << QStringLiteral("cam*") << int(QRegExp::WildcardUnix) << false;
+    QTest::newRow("schema") << QStringLiteral("cam.*") << int(QRegExp::W3CXmlSchema11) << false;
+    QTest::newRow("fixed") << QStringLiteral("cam.*") << int(QRegExp::FixedString) << false;
+}
+
+void TestFilterPattern::commonExpressionsAreRecognised()
+{
+    QFETCH(QString, text);
+    QFETCH(int, syntax);
+    QFETCH(bool, recognised);
+    const QRegExp regExp(text, Qt::CaseSensitive, QRegExp::PatternSyntax(syntax));
+    const FilterPattern prepared(regExp);
+    QCOMPARE(prepared.usesAutomaton(), recognised);
+    for (const char* sample : {"", "a", "aa", "abc", "online", "onhold", "offline", "Camera 7", "10.0.12.7", "10x0x1x7",
+             "ff09", "abcdcef", "a b", "b", "ab", "a(b)", "cam(1x)+", "cam", "cam1", "c", "a|", "a\\", "\\", "$", "^a"}) {
+        const QString fault = disagreement(regExp, prepared, QString::fromLatin1(sample));
+        QVERIFY2(fault.isEmpty(), qPrintable(fault));
+    }
+}
+
+void TestFilterPattern::aMinimalPatternIsLeftToQRegExp()
+{
+    QRegExp regExp(QStringLiteral("a.*"));
+    regExp.setMinimal(true);
+    const FilterPattern prepared(regExp);
+    QVERIFY(!prepared.usesAutomaton());
+    QCOMPARE(prepared.matchesWhole(QStringLiteral("abc")), regExp.exactMatch(QStringLiteral("abc")));
+}
+
+void TestFilterPattern::placesEndAtSixtyFour()
+{
+    for (const int places : {63, 64, 65}) {
+        const QString word(places - 1, QLatin1Char('a'));
+        const QRegExp regExp(word + QLatin1Char('.'));
+        const FilterPattern prepared(regExp);
+        QCOMPARE(prepared.usesAutomaton(), places <= 64);
+        for (int length = places - 2; length <= places + 1; ++length) {
+            const QString fault = disagreement(regExp, prepared, QString(length, QLatin1Char('a')));
+            QVERIFY2(fault.isEmpty(), qPrintable(fault));
+        }
+    }
+}
+
+void TestFilterPattern::everyCharacterAgainstTheClasses()
+{
+    for (const char* text : {".", "\\d", "\\D", "\\s", "\\S", "\\w", "\\W", "[0-9a-f]", "[^0-9a-f]", "(k)", "(K)", "(s|I)",
+             "[^0-9]"}) {
+        for (const Qt::CaseSensitivity sensitivity : {Qt::CaseSensitive, Qt::CaseInsensitive}) {
+            const QRegExp regExp(QString::fromLatin1(text), sensitivity);
+            const FilterPattern prepared(regExp);
+            for (uint unit = 0; unit < 0x10000; ++unit) {
+                const QString one {QChar(unit)};
+                if (regExp.exactMatch(one) != prepared.matchesWhole(one)) {
+                    QFAIL(qPrintable(describe(regExp, one) + QStringLiteral(", unit %1").arg(unit)));
+                }
+            }
+        }
+    }
+}
+
+void TestFilterPattern::randomExpressionsAgreeWithQRegExp()
+{
+    const uint seed = 31;
+    std::mt19937 random(seed);
+    const auto below = [&random](int limit) { return int(random() % uint(limit)); };
+    const QStringList atoms {QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c"), QStringLiteral("K"),
+        QStringLiteral("."), QStringLiteral("\\d"), QStringLiteral("\\W"), QStringLiteral("[ab]"),
+        QStringLiteral("[^a-b]"), QStringLiteral("\\."), QStringLiteral("1"), QString::fromUtf8("\xC3\x9F")};
+    const QStringList signs {QStringLiteral("*"), QStringLiteral("+"), QStringLiteral("?"), QString(), QString(),
+        QString()};
+    std::function<QString(int)> expression = [&](int depth) {
+        QString result;
+        for (int i = 1 + below(3); i > 0; --i) {
+            result += depth > 0 && below(3) == 0 ? QLatin1Char('(') + expression(depth - 1) + QLatin1Char(')')
+                                                 : atoms.at(below(atoms.size()));
+            result += signs.at(below(signs.size()));
+        }
+        return below(4) == 0 ? result + QLatin1Char('|') + expression(depth > 0 ? depth - 1 : 0) : result;
+    };
+    const QString alphabet = QString::fromUtf8("aaabbbccckK1.-\xC3\x9F\xE2\x84\xAA\xF0\x90\x90\x80");
+    int recognised = 0;
+    int matches = 0;
+    for (int round = 0; round < 5000; ++round) {
+        const QRegExp regExp(expression(2), below(3) == 0 ? Qt::CaseInsensitive : Qt::CaseSensitive,
+            below(2) == 0 ? QRegExp::RegExp : QRegExp::RegExp2);
+        const FilterPattern prepared(regExp);
+        recognised += prepared.usesAutomaton() ? 1 : 0;
+        for (int i = 0; i < 12; ++i) {
+            QString text;
+            for (int length = below(7); length > 0; --length) {
+                text += alphabet.at(below(alphabet.size()));
+            }
+            matches += prepared.usesAutomaton() && prepared.matchesWhole(text) ? 1 : 0;
+            const QString fault = disagreement(regExp, prepared, text);
+            QVERIFY2(fault.isEmpty(), qPrintable(fault + QStringLiteral(", seed %1, round %2").arg(seed).arg(round)));
+        }
+    }
+    QVERIFY2(recognised > 3000, QByteArray::number(recognised));
+    QVERIFY2(matches > 3000, QByteArray::number(matches));
 }
 
 ZELKOV_TEST_MAIN(TestFilterPattern)

@@ -186,6 +186,9 @@ private Q_SLOTS:
     void aCellWithoutPictureHasItsBarInTheCell();
     void captionsLookLikePlainText_data();
     void captionsLookLikePlainText();
+    void keptCaptionsFollowColourAndSize();
+    void captionsLookLikePlainCalls_data();
+    void captionsLookLikePlainCalls();
     void captionShrinksTheTextRectangle();
     void captionSetsPenAndBrush();
     void longCaptionsAreElidedAtTheLeft();
@@ -680,6 +683,84 @@ void TestTableViewDelegate::captionsLookLikePlainText()
             // Blending a kept text rounds twice.
             QVERIFY2(difference <= 4, QByteArray::number(width) + " wide: " + QByteArray::number(difference));
         }
+    }
+}
+
+void TestTableViewDelegate::keptCaptionsFollowColourAndSize()
+{
+    QStringListModel model({QStringLiteral("Gate")});
+    Delegate delegate;
+    for (int round = 0; round < 12; ++round) {
+        const bool selected = round % 2 != 0;
+        const bool scaled = round / 2 % 2 != 0;
+        const QRect rect(20, 10, 160, round < 8 ? 160 : 120);
+        delegate.setScaleFont(scaled);
+        const QRect bar = delegate.getTitleRect(rect);
+        const QImage expected = plainCaption(bar, QStringLiteral("Gate"), delegate.getFontSize(bar.height()),
+            selected ? c_selectedBar : c_plainBar);
+        const int difference = largestDifference(painted(delegate, model.index(0, 0), rect, selected), expected);
+        QVERIFY2(difference <= 4, QByteArray::number(round) + ": " + QByteArray::number(difference));
+    }
+}
+
+void TestTableViewDelegate::captionsLookLikePlainCalls_data()
+{
+    QTest::addColumn<QRect>("background");
+    QTest::addColumn<QRect>("text");
+    QTest::addColumn<double>("opacity");
+    QTest::addColumn<int>("mode");
+    const int over = QPainter::CompositionMode_SourceOver;
+    const QRect bar(20, 30, 160, 24);
+    QTest::newRow("same") << bar << bar << 1.0 << over;
+    QTest::newRow("text within") << bar << QRect(50, 32, 90, 20) << 1.0 << over;
+    QTest::newRow("text within, moved") << bar << QRect(60, 34, 90, 20) << 1.0 << over;
+    QTest::newRow("text sticks out") << bar << QRect(100, 40, 120, 30) << 1.0 << over;
+    QTest::newRow("text beside") << bar << QRect(20, 80, 160, 24) << 1.0 << over;
+    QTest::newRow("fading") << bar << bar << 0.5 << over;
+    QTest::newRow("multiplied") << bar << bar << 1.0 << int(QPainter::CompositionMode_Multiply);
+    QTest::newRow("added") << bar << bar << 1.0 << int(QPainter::CompositionMode_Plus);
+    QTest::newRow("copied") << bar << bar << 1.0 << int(QPainter::CompositionMode_Source);
+}
+
+void TestTableViewDelegate::captionsLookLikePlainCalls()
+{
+    QFETCH(QRect, background);
+    QFETCH(QRect, text);
+    QFETCH(double, opacity);
+    QFETCH(int, mode);
+    QStringListModel model({QStringLiteral("Gate")});
+    Delegate delegate;
+    // With the captions of the other cases already kept, and twice with its own.
+    const auto paintOn = [&](QImage& image, double strength, int how, QRect bar, QRect words) {
+        QPainter painter(&image);
+        painter.setOpacity(strength);
+        painter.setCompositionMode(QPainter::CompositionMode(how));
+        if (bar == words) {
+            delegate.paintCaption(bar, bar, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar, Qt::DisplayRole);
+        } else {
+            delegate.paintCaption(bar, words, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar,
+                Qt::DisplayRole);
+        }
+    };
+    QImage other = canvas();
+    paintOn(other, 1, QPainter::CompositionMode_SourceOver, QRect(20, 30, 160, 24), QRect(20, 30, 160, 24));
+    paintOn(other, 1, QPainter::CompositionMode_SourceOver, QRect(20, 30, 160, 24), QRect(50, 32, 90, 20));
+    for (int round = 0; round < 2; ++round) {
+        QImage expected = canvas();
+        QPainter painter(&expected);
+        painter.setOpacity(opacity);
+        painter.setCompositionMode(QPainter::CompositionMode(mode));
+        painter.fillRect(background, c_plainBar);
+        QFont font = QFontDatabase::systemFont(QFontDatabase::FixedFont);
+        font.setPixelSize(12);
+        painter.setFont(font);
+        painter.setPen(Qt::white);
+        painter.drawText(text.adjusted(4, 0, -4, 0), Qt::AlignLeft | Qt::AlignVCenter, QStringLiteral("Gate"));
+        painter.end();
+        QImage result = canvas();
+        paintOn(result, opacity, mode, background, text);
+        const int difference = largestDifference(result, expected);
+        QVERIFY2(difference <= 4, QByteArray::number(difference));
     }
 }
 
