@@ -174,6 +174,6 @@ void PtzPage::rehearse(Hand& hand)
     // Held, or it would spring back.
     hand.call(m_tilt, [this] { m_tilt->setValue(40); });
     const QPoint middle = m_pan->rect().center();
-    hand.moveTo(m_pan, middle).press().glideTo(m_pan, middle + QPoint(90, 0), 300).wait(1300);
+    hand.moveTo(m_pan, middle).press().glideTo(m_pan, middle + QPoint(90, 0), 300).wait(400);
 }
 }

@@ -25,7 +25,7 @@ Outcome run(const QStringList& arguments)
     QProcess process;
     process.start(QStringLiteral(GALLERY_PROGRAM), arguments);
     Outcome outcome;
-    if (process.waitForFinished(90000) && process.exitStatus() == QProcess::NormalExit) {
+    if (process.waitForFinished(240000) && process.exitStatus() == QProcess::NormalExit) {
         outcome.code = process.exitCode();
     }
     outcome.out = QString::fromUtf8(process.readAllStandardOutput());
