@@ -19,7 +19,8 @@ class FilterAutomaton;
 ///
 /// Most of what a user types into a search box is plain text, for which the machinery of QRegExp is slow. A pattern
 /// that can only match itself is recognised once, in the constructor, and then compared as a string; every other one
-/// is left to QRegExp, but for whole matches of common expressions. The results are those of QRegExp for every pattern and every text.
+/// is left to QRegExp, but for whole matches of common expressions. The results are those of QRegExp for every pattern
+/// and every text.
 class ZELKOV_WIDGETS_EXPORT FilterPattern
 {
 public:

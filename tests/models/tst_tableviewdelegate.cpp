@@ -736,7 +736,8 @@ void TestTableViewDelegate::captionsLookLikePlainCalls()
         painter.setOpacity(strength);
         painter.setCompositionMode(QPainter::CompositionMode(how));
         if (bar == words) {
-            delegate.paintCaption(bar, bar, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar, Qt::DisplayRole);
+            delegate.paintCaption(bar, bar, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar,
+                Qt::DisplayRole);
         } else {
             delegate.paintCaption(bar, words, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar,
                 Qt::DisplayRole);
