@@ -187,6 +187,7 @@ private Q_SLOTS:
     void captionsLookLikePlainText_data();
     void captionsLookLikePlainText();
     void keptCaptionsFollowColourAndSize();
+    void oneBarInTwoFontSizesIsTwoCaptions();
     void captionsLookLikePlainCalls_data();
     void captionsLookLikePlainCalls();
     void captionShrinksTheTextRectangle();
@@ -700,6 +701,23 @@ void TestTableViewDelegate::keptCaptionsFollowColourAndSize()
             selected ? c_selectedBar : c_plainBar);
         const int difference = largestDifference(painted(delegate, model.index(0, 0), rect, selected), expected);
         QVERIFY2(difference <= 4, QByteArray::number(round) + ": " + QByteArray::number(difference));
+    }
+}
+
+void TestTableViewDelegate::oneBarInTwoFontSizesIsTwoCaptions()
+{
+    QStringListModel model({QStringLiteral("Gate")});
+    Delegate delegate;
+    for (const bool scaled : {false, true, false}) {
+        delegate.setScaleFont(scaled);
+        QImage result = canvas();
+        QPainter painter(&result);
+        QRect bar(20, 30, 160, 40);
+        delegate.paintCaption(bar, bar, model.index(0, 0), &painter, optionFor(QRect()), c_plainBar, Qt::DisplayRole);
+        painter.end();
+        const QImage expected
+            = plainCaption(QRect(20, 30, 160, 40), QStringLiteral("Gate"), scaled ? 24 : 12, c_plainBar);
+        QVERIFY(largestDifference(result, expected) <= 4);
     }
 }
 
