@@ -10,6 +10,7 @@
 #include <QtCore/QTimeLine>
 #include <QtCore/QTimer>
 #include <QtGui/QWheelEvent>
+#include <QtWidgets/QScrollBar>
 
 namespace
 {
@@ -33,7 +34,11 @@ ZoomScrollArea::ZoomScrollArea(QWidget* parent)
     , m_verticalBar(new NicerScrollBar(this, Qt::Vertical, NicerScrollBar::epAutomatic, this))
     , m_wheelTimer(newZoomTimer(this, c_TouchMemory))
     , m_zoomTimer(newZoomTimer(this, c_ZoomStop))
+    , m_watchedBars {horizontalScrollBar(), verticalScrollBar()}
 {
+    // Behind Qt's own slots.
+    connect(horizontalScrollBar(), &QScrollBar::valueChanged, this, &ZoomScrollArea::reportScrolling);
+    connect(verticalScrollBar(), &QScrollBar::valueChanged, this, &ZoomScrollArea::reportScrolling);
     vx::connect(m_wheelTimer, "2timeout()", this, "1wheelTimeout()", Qt::AutoConnection);
     vx::connect(m_zoomTimer, "2timeout()", this, "1stopAllZooming()", Qt::AutoConnection);
     viewport()->setAttribute(Qt::WA_AcceptTouchEvents);
@@ -142,9 +147,20 @@ bool ZoomScrollArea::viewportEvent(QEvent* event)
 
 void ZoomScrollArea::scrollContentsBy(int dx, int dy)
 {
-    const QPointer<ZoomScrollArea> alive(this);
     QScrollArea::scrollContentsBy(dx, dy);
-    if (alive) {
+    m_scrolled = true;
+    // Called by a bar, Qt touches the area once more when this returns, so a slot could not delete it: the report
+    // waits for reportScrolling(), which the same value of the bar calls next.
+    const QObject* const caller = sender();
+    if (caller == nullptr || (caller != m_watchedBars[0] && caller != m_watchedBars[1])) {
+        reportScrolling();
+    }
+}
+
+void ZoomScrollArea::reportScrolling()
+{
+    if (m_scrolled) {
+        m_scrolled = false;
         Q_EMIT scrollAreaChanged();
     }
 }

@@ -54,6 +54,7 @@ private Q_SLOTS:
 
 private:
     double zoomFactor() const;
+    void reportScrolling();
 
     bool m_touchActive = false;
     NicerScrollBar* m_horizontalBar;
@@ -62,4 +63,6 @@ private:
     QTimer* m_zoomTimer;
     int m_scheduledScalings = 0;
     bool m_zooming = false;
+    QObject* m_watchedBars[2]; // only compared
+    bool m_scrolled = false;
 };
