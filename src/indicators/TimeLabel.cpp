@@ -182,6 +182,14 @@ void TimeLabel::calcSizes()
     }
     const QString text = m_dateTimeEdit->text() + m_timeDiffLabel->text();
     QFont font = m_timeDiffLabel->font();
+    if (text == m_sizedText && around->width() == m_sizedWidth && m_maxHeight == m_sizedMaxHeight
+        && font == m_sizedFont) {
+        return;
+    }
+    m_sizedText = text;
+    m_sizedWidth = around->width();
+    m_sizedMaxHeight = m_maxHeight;
+    m_sizedFont = font;
     for (int size = 3; size < m_maxHeight; ++size) {
         font.setPointSize(size);
         const QFontMetrics metrics(font);
@@ -195,6 +203,7 @@ void TimeLabel::calcSizes()
         m_fontPointSize = size - 1;
         font.setPointSize(m_fontPointSize);
         m_timeDiffLabel->setFont(font);
+        m_sizedFont = m_timeDiffLabel->font();
         QFont editFont = m_dateTimeEdit->font();
         editFont.setPointSize(m_fontPointSize);
         m_dateTimeEdit->setFont(editFont);

@@ -7,6 +7,7 @@
 #include <QtCore/QDateTime>
 #include <QtCore/QPoint>
 #include <QtCore/QString>
+#include <QtGui/QFont>
 #include <QtWidgets/QWidget>
 
 class QLabel;
@@ -106,6 +107,11 @@ private:
     bool m_errorSymbol = false;
     ClickHelper* m_clickHelper = nullptr;
     QString m_errorText;
+    // What the present sizes were found for: a frame of the same second needs no new search.
+    QString m_sizedText;
+    int m_sizedWidth = -1;
+    int m_sizedMaxHeight = -1;
+    QFont m_sizedFont;
     DateTimeEdit** m_rescuedEdit = nullptr; // where the destructor leaves the edit that is in its own signal
 };
 }

@@ -24,6 +24,7 @@ public:
     QVariant value() override;
     /// The widget, also after it was put elsewhere; null when it has died.
     QWidget* getFocusItem() override;
+    QWidget* widget() const { return m_widget; } //!< null when it has died
 
 private:
     QPointer<QWidget> m_widget;

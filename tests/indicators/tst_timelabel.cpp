@@ -247,6 +247,28 @@ private Q_SLOTS:
         QVERIFY(overlay.difference()->font().pointSize() < size);
     }
 
+    void aFrameOfTheSameSecondKeepsTheSizesAndAnotherParentChangesThem()
+    {
+        Overlay overlay;
+        overlay.show();
+        const int size = overlay.difference()->font().pointSize();
+        const QSize extent = overlay.label->size();
+        overlay.label->setFrametime(noon + 40000);
+        QCOMPARE(overlay.difference()->font().pointSize(), size);
+        QCOMPARE(overlay.label->size(), extent);
+        overlay.window.resize(250, 300);
+        overlay.label->setFrametime(noon + 80000);
+        QVERIFY(overlay.difference()->font().pointSize() < size);
+        overlay.window.resize(640, 300);
+        QFont other = overlay.difference()->font();
+        other.setPointSize(4);
+        overlay.difference()->setFont(other); // a client's or a style sheet's
+        overlay.label->setFrametime(noon + 120000);
+        QCOMPARE(overlay.difference()->font().pointSize(), size);
+        overlay.label->showFrametime(true, noon + 160000, 20, 5, true, Qt::AlignLeft, false);
+        QVERIFY(overlay.difference()->font().pointSize() < size);
+    }
+
     void anUnreadableLineIsGone()
     {
         Overlay overlay;
