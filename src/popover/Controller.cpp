@@ -21,7 +21,7 @@ namespace PopoverWidget
 namespace
 {
 constexpr int c_GrowTime = 400; // ms
-constexpr int c_ButtonSpacing = 8;
+constexpr int c_ControllerButtonSpacing = 8;
 constexpr int c_InternalItemID = -1;
 
 void logNoBalloon(const char* function)
@@ -480,7 +480,7 @@ int Controller::exec(QFlags<QDialogButtonBox::StandardButton> buttons)
     vx::connect(box, "2rejected()", this, "1setRejected()", Qt::AutoConnection);
     vx::connect(box, "2accepted()", this, "1dismiss()", Qt::AutoConnection);
     vx::connect(box, "2rejected()", this, "1dismiss()", Qt::AutoConnection);
-    m_container->addSpacing(c_ButtonSpacing);
+    m_container->addSpacing(c_ControllerButtonSpacing);
     m_container->addWidgetItem(box, QStringLiteral("buttonBox"), c_InternalItemID);
     setActive(true, EPopoverShowFlags(QFlag(epsBalloon | epsNoFade)), true);
     // A slot may have closed or deleted it already, and nothing would end the loop.
