@@ -9,6 +9,15 @@
 
 namespace vx
 {
+namespace
+{
+// A name with a null character is no file; Qt would print a warning.
+QString searchEditFile(const QString& path)
+{
+    return path.contains(QChar::Null) ? QString() : path;
+}
+}
+
 SearchEdit::SearchEdit(QWidget* parent)
     : QLineEdit(parent)
 {
@@ -51,12 +60,12 @@ void SearchEdit::initialize()
 
 void SearchEdit::setClearIcon(const QString& path)
 {
-    m_clearButton->setIcon(QIcon(path));
+    m_clearButton->setIcon(QIcon(searchEditFile(path)));
 }
 
 void SearchEdit::setLoopIcon(const QString& path)
 {
-    m_loopLabel->setPixmap(QPixmap(path));
+    m_loopLabel->setPixmap(QPixmap(searchEditFile(path)));
 }
 
 void SearchEdit::textChanged(QString text)
