@@ -16,6 +16,20 @@ namespace gallery
 {
 namespace
 {
+// The flags of a performed row: "text, left button".
+QString flagWords(int flags)
+{
+    const char* const words[] = {"icon", "text", "additional text", "control", "left button", "right button",
+        "double click", "disclosure"};
+    QStringList set;
+    for (int bit = 0; bit < 8; ++bit) {
+        if ((flags & (1 << bit)) != 0) {
+            set << QLatin1String(words[bit]);
+        }
+    }
+    return set.isEmpty() ? QStringLiteral("0") : set.join(QLatin1String(" | "));
+}
+
 QString pointText(const QPoint& point)
 {
     return QStringLiteral("%1,%2").arg(point.x()).arg(point.y());
@@ -46,7 +60,7 @@ QString argumentText(const QByteArray& type, int id, const void* data)
         return QString::fromLatin1(type);
     }
     if (type.endsWith("EItemPerformedFlags")) {
-        return QString::number(int(*static_cast<const vx::PopoverWidget::EItemPerformedFlags*>(data)));
+        return flagWords(int(*static_cast<const vx::PopoverWidget::EItemPerformedFlags*>(data)));
     }
     const QVariant value = id == QMetaType::QVariant ? *static_cast<const QVariant*>(data) : QVariant(id, data);
     if (!value.isValid()) {
