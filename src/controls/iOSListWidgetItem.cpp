@@ -83,8 +83,13 @@ iOSListWidgetItem::iOSListWidgetItem(iOSListWidget* list, QWidget* itemWidget, c
     if (list) {
         list->addItem(this);
         list->setItemWidget(this, m_container);
-        list->itemHasBeenAdded();
         list->setMouseTracking(true);
+        // A slot may delete the list, and with it this row that is only being made.
+        const QPointer<QObject> alive(this);
+        list->itemHasBeenAdded();
+        if (!alive) {
+            return;
+        }
     }
     if (m_selectedWidget && !m_inEditMode) {
         m_selectedWidget->hide();
