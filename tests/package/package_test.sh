@@ -118,7 +118,7 @@ libraries() {
     # Weak names of templates stay visible whatever is asked; what is strong must be ours.
     local foreign
     foreign=$(nm -DC --defined-only "$library" | awk '$2 == "T"' | cut -d' ' -f3- \
-        | grep -Ev '^(non-virtual thunk to )?(vx::|zelkov_|_init|_fini|[A-Za-z]+(View|Controller|Animation|Thing|Area|CheckBox|ScrollBar|Slideshow|ToolBar|Edit|Label|Button|Widget)::)' || true)
+        | grep -Ev '^(non-virtual thunk to )?(vx::|zelkov_|_init|_fini|[A-Za-z]+(View|Controller|Animation|Thing|Area|CheckBox|ScrollBar|Slideshow|ToolBar|Edit|Label|Button|Widget|Icon)::)' || true)
     [ -z "$foreign" ] || fail "visible names that are not ours: $foreign"
 }
 
