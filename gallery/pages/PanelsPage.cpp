@@ -179,8 +179,10 @@ QWidget* PanelsPage::makeSettings()
     m_animated->setToolTip(tr("fadein() and fadeout() with force: not from where the panel is"));
     layout->addSpacing(8);
     layout->addWidget(m_animated);
-    layout->addStretch(1);
-    layout->addWidget(label(tr("Click the handles, also while a panel moves; drag the lower one."), "hint"));
+    layout->addSpacing(8);
+    QLabel* const hint = label(tr("Click the handles, also while a panel moves; drag the lower one."), "hint");
+    hint->setWordWrap(true);
+    layout->addWidget(hint, 1);
     return row;
 }
 
