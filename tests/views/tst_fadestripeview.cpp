@@ -337,9 +337,10 @@ void TestFadeStripeView::stylesNameTheWidgets()
     QFETCH(int, style);
     Scene scene;
     using Setter = void (FadeStripeView::*)();
-    const Setter setters[] = {&FadeStripeView::setStyleDefault, &FadeStripeView::setStyleRed,
+    static const Setter setters[] = {&FadeStripeView::setStyleDefault, &FadeStripeView::setStyleRed,
         &FadeStripeView::setStyleGreen, &FadeStripeView::setStyleSolidGrey, &FadeStripeView::setStyleSolidBlue};
-    (scene.stripe->*setters[style])();
+    const Setter set = setters[qBound(0, style, 4)];
+    (scene.stripe->*set)();
     QWidget* const handle = scene.movingBar()->layout()->itemAt(0)->widget()->layout()->itemAt(0)->widget();
     const auto names = [&] {
         return QStringList {scene.bar(true)->objectName(), scene.bar(false)->objectName(), handle->objectName()};
@@ -347,7 +348,7 @@ void TestFadeStripeView::stylesNameTheWidgets()
     QTEST(names(), "names");
     // Nothing if the header has its name, whatever became of the others.
     handle->setObjectName(word("other"));
-    (scene.stripe->*setters[style])();
+    (scene.stripe->*set)();
     QCOMPARE(handle->objectName(), word("other"));
     FadeStripeView::updateStyle(nullptr, word("x"));
 }
