@@ -12,6 +12,7 @@ DateTimeEdit::DateTimeEdit(QWidget* parent)
     : QDateTimeEdit(parent)
 {
     setAttribute(Qt::WA_MacShowFocusRect, false);
+    m_lineEdit = QDateTimeEdit::lineEdit();
 }
 
 DateTimeEdit::~DateTimeEdit() = default;
@@ -37,18 +38,21 @@ void DateTimeEdit::setLineEdit(QLineEdit* edit)
         return;
     }
     QDateTimeEdit::setLineEdit(edit);
+    m_lineEdit = edit;
     letMouseThrough();
 }
 
 void DateTimeEdit::letMouseThrough()
 {
-    lineEdit()->setAttribute(Qt::WA_TransparentForMouseEvents, isReadOnly());
+    if (m_lineEdit) {
+        m_lineEdit->setAttribute(Qt::WA_TransparentForMouseEvents, isReadOnly());
+    }
 }
 
 bool DateTimeEdit::event(QEvent* event)
 {
-    if (isReadOnly() && lineEdit()->hasSelectedText()) { // deselecting comes back here with a query
-        lineEdit()->deselect();
+    if (isReadOnly() && m_lineEdit && m_lineEdit->hasSelectedText()) { // deselecting comes back here with a query
+        m_lineEdit->deselect();
     }
     if (event->type() == QEvent::ReadOnlyChange) {
         letMouseThrough();

@@ -5,10 +5,10 @@
 #include "foundation/Export.h"
 
 #include <QtCore/QDateTime>
+#include <QtCore/QPointer>
 #include <QtGui/QFont>
 #include <QtWidgets/QDateTimeEdit>
-
-class QLineEdit;
+#include <QtWidgets/QLineEdit>
 
 namespace vx
 {
@@ -50,5 +50,7 @@ protected:
 
 private:
     void letMouseThrough();
+
+    QPointer<QLineEdit> m_lineEdit; // the base class names one that is being deleted while it is replaced
 };
 }

@@ -525,9 +525,10 @@ private Q_SLOTS:
         QPointer<vx::DialButton> gone(panel.dial);
         QObject::connect(panel.dial, signal.constData(), panel.dial, "1deleteLater()");
         zelkovtest::Pointer pointer(&panel.window);
-        pointer.move(panel.at(50));
+        const QPoint place = panel.at(50);
+        pointer.move(place);
         pointer.press();
-        pointer.move(panel.at(50) + QPoint(60, 0));
+        pointer.move(place + QPoint(60, 0));
         pointer.release();
         QTRY_VERIFY(!gone);
     }
