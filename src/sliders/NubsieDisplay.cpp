@@ -234,7 +234,10 @@ QPointF Nubsie::getPosition() const
 void Nubsie::setPosition(QPointF pos)
 {
     m_position = pos;
-    move(NubsieMath::topLeft(pos, QWidget::size()));
+    // Far beyond any window, but where a rectangle still has a right and a bottom that an int can hold.
+    constexpr int farAway = 1 << 28;
+    const QPoint place = NubsieMath::topLeft(pos, QWidget::size());
+    move(qBound(-farAway, place.x(), farAway), qBound(-farAway, place.y(), farAway));
     update();
 }
 
