@@ -11,10 +11,21 @@
 #include <QtWidgets/QStyle>
 #include <QtWidgets/QStyleOption>
 
+#include <limits>
+
 namespace vx
 {
 namespace
 {
+// The size of a widget that may have been put where a bottom or a right no longer fit into an int.
+QSize nubsieExtent(const QRect& place)
+{
+    const auto extent = [](int first, int last) {
+        return static_cast<int>(qBound<qint64>(0, qint64(last) - first + 1, std::numeric_limits<int>::max()));
+    };
+    return QSize(extent(place.left(), place.right()), extent(place.top(), place.bottom()));
+}
+
 constexpr int c_NubsieGrowTime = 100;
 constexpr int c_NubsieShrinkTime = 250;
 constexpr int c_NubsieMoveTime = 500;
@@ -147,7 +158,7 @@ void Nubsie::updateNubsie(bool balloon)
         clearScaledIconCache();
     }
     m_iconCacheKey = m_icon.cacheKey();
-    updateScaledIcons(QWidget::size());
+    updateScaledIcons(nubsieExtent(geometry()));
     update();
 }
 
@@ -236,7 +247,7 @@ void Nubsie::setPosition(QPointF pos)
     m_position = pos;
     // Far beyond any window, but where a rectangle still has a right and a bottom that an int can hold.
     constexpr int farAway = 1 << 28;
-    const QPoint place = NubsieMath::topLeft(pos, QWidget::size());
+    const QPoint place = NubsieMath::topLeft(pos, nubsieExtent(geometry()));
     move(qBound(-farAway, place.x(), farAway), qBound(-farAway, place.y(), farAway));
     update();
 }
