@@ -125,8 +125,12 @@ private:
         if (below(16) == 0) {
             return {below(4000) - 2000, below(4000) - 2000};
         }
-        const QSize size = m_subject.widget->size().expandedTo(QSize(1, 1));
-        return {below(size.width() + 10) - 5, below(size.height() + 10) - 5};
+        // A geometry that was written may reach beyond the range of int: QRect cannot tell its size then.
+        const QRect place = m_subject.widget->geometry();
+        const auto extent = [](int first, int last) {
+            return static_cast<int>(qBound<qint64>(1, qint64(last) - first + 1, 100000));
+        };
+        return {below(extent(place.left(), place.right()) + 10) - 5, below(extent(place.top(), place.bottom()) + 10) - 5};
     }
 
     void send(QEvent& event)
