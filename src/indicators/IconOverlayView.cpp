@@ -66,9 +66,18 @@ void IconOverlayView::init(QWidget& watched)
 void IconOverlayView::setAnimationType(EAnimationType type)
 {
     m_animationType = type;
-    if (type == eatGeometry) {
+    adoptProperty();
+}
+
+// Qt refuses another property while the animation runs: the next start takes it then.
+void IconOverlayView::adoptProperty()
+{
+    if (m_animation.state() != QAbstractAnimation::Stopped) {
+        return;
+    }
+    if (m_animationType == eatGeometry) {
         m_animation.setPropertyName("geometry");
-    } else if (type == eatOpacity) {
+    } else if (m_animationType == eatOpacity) {
         m_animation.setPropertyName("windowOpacity");
     }
 }
@@ -202,6 +211,7 @@ IconOverlayView* IconOverlayView::showTextAndIcon(
 void IconOverlayView::appear()
 {
     m_animation.stop();
+    adoptProperty();
     if (!m_animation.targetObject()) {
         return;
     }
@@ -231,6 +241,7 @@ void IconOverlayView::disappear()
     vx::connect(&m_animation, "2finished()", this, "1disappeared()",
         static_cast<Qt::ConnectionType>(Qt::AutoConnection | Qt::UniqueConnection));
     m_animation.stop();
+    adoptProperty();
     if (!m_animation.targetObject()) {
         disappeared();
         return;

@@ -37,7 +37,8 @@ public:
     IconOverlayView(QWidget* content, QWidget* parent);
     ~IconOverlayView() override;
 
-    /// Other values are stored; the animated property then stays.
+    /// Other values are stored; the animated property then stays. While the sign comes or goes, the change takes
+    /// effect with its next part.
     void setAnimationType(EAnimationType type);
 
     /// Shows the sign until hideIconNow(), without animation.
@@ -73,6 +74,7 @@ private Q_SLOTS:
     void appeared();
 
 private:
+    void adoptProperty();
     void appear();
     void disappear();
     void init(QWidget& watched);

@@ -226,6 +226,35 @@ private Q_SLOTS:
         QTRY_VERIFY_WITH_TIMEOUT(!view, 8000);
     }
 
+    void aTypeSetWhileTheSignGrowsCountsForItsWayOut()
+    {
+        QWidget window;
+        window.resize(200, 200);
+        window.show();
+        auto* const label = textLabel(QSize(30, 30), &window);
+        auto* const view = new View(label, &window);
+        view->showIconFor(80);
+        view->setAnimationType(View::eatOpacity); // no warning of Qt either
+        QTRY_VERIFY(label->windowOpacity() < 1.0 || view->isHidden());
+        QTRY_VERIFY(view->isHidden());
+        QCOMPARE(label->windowOpacity(), 1.0); // no window: the property stays, and is not animated
+    }
+
+    void anUnknownTypeLeavesTheAnimationAsItWas()
+    {
+        QWidget window;
+        window.resize(200, 200);
+        window.show();
+        auto* const label = new QLabel(QStringLiteral("!"), &window);
+        auto* const view = new View(label, &window);
+        view->showIconFor(20);
+        QTRY_VERIFY(view->isHidden());
+        view->setAnimationType(static_cast<View::EAnimationType>(7));
+        view->showIconFor(60);
+        QTRY_VERIFY(view->isHidden());
+        QCOMPARE(label->size(), QSize(1, 1)); // still the geometry, with the values of the way out
+    }
+
     void aPressFallsThrough()
     {
         Ground window;

