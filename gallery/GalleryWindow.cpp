@@ -101,6 +101,7 @@ void GalleryWindow::setLanguage(const QString& language)
         QLibraryInfo::location(QLibraryInfo::TranslationsPath) + QStringLiteral("/qtbase_") + language,
         QStringLiteral(":/Translations/ZelkovWidgets_") + language,
         QStringLiteral(":/gallery/gallery_") + language,
+        QStringLiteral(":/client/client_") + language,
     };
     for (const QString& file : files) {
         auto* translator = new QTranslator(this);

@@ -181,20 +181,28 @@ void TestGalleryCli::textsFollowTheLanguage()
 void TestGalleryCli::cataloguesAreComplete_data()
 {
     QTest::addColumn<QString>("name");
-    QTest::newRow("de") << QStringLiteral("gallery_de.ts");
-    QTest::newRow("fr") << QStringLiteral("gallery_fr.ts");
+    QTest::addColumn<QStringList>("folders");
+    // The client has catalogues of its own.
+    const QStringList folders{QStringLiteral("."), QStringLiteral("pages"), QStringLiteral("cameras")};
+    QTest::newRow("de") << QStringLiteral("gallery_de.ts") << folders;
+    QTest::newRow("fr") << QStringLiteral("gallery_fr.ts") << folders;
+    QTest::newRow("client, de") << QStringLiteral("client/client_de.ts") << QStringList{QStringLiteral("client")};
+    QTest::newRow("client, fr") << QStringLiteral("client/client_fr.ts") << QStringList{QStringLiteral("client")};
 }
 
 void TestGalleryCli::cataloguesAreComplete()
 {
     QFETCH(QString, name);
+    QFETCH(QStringList, folders);
     QTemporaryDir folder;
-    const QString copy = folder.filePath(name);
+    const QString copy = folder.filePath(QFileInfo(name).fileName());
     QVERIFY(QFile::copy(QStringLiteral(GALLERY_FOLDER "/") + name, copy));
     QProcess lupdate;
-    lupdate.start(QStringLiteral(LUPDATE_PROGRAM), {QStringLiteral("-silent"), QStringLiteral("-locations"),
-                                                    QStringLiteral("none"), QStringLiteral(GALLERY_FOLDER),
-                                                    QStringLiteral("-ts"), copy});
+    lupdate.setWorkingDirectory(QStringLiteral(GALLERY_FOLDER));
+    lupdate.start(QStringLiteral(LUPDATE_PROGRAM),
+                  QStringList{QStringLiteral("-silent"), QStringLiteral("-locations"), QStringLiteral("none"),
+                              QStringLiteral("-no-recursive")}
+                      + folders + QStringList{QStringLiteral("-ts"), copy});
     QVERIFY(lupdate.waitForFinished(30000));
     QCOMPARE(lupdate.exitCode(), 0);
     QFile file(copy);

@@ -1,0 +1,11 @@
+// SPDX-License-Identifier: MIT
+// The whole client.
+#include "ClientWindow.h"
+
+namespace client
+{
+ClientWindow::ClientWindow(QWidget* parent)
+    : QWidget(parent)
+{
+}
+}
