@@ -85,6 +85,7 @@ def overlays():
     folder = os.path.join(HERE, "pictures", "overlays")
     signs = {"play": [polygon((38, 28), (70, 48), (38, 68))],
              "pause": [box(33, 29, 43, 67, 2), box(53, 29, 63, 67, 2)],
+             "online": [line(28, 50, 42, 64, 4), line(42, 64, 69, 34, 4)],
              "snapshot": [box(24, 36, 72, 68, 6), box(38, 29, 58, 40, 4)]}
     for name, glyph in signs.items():
         layers = disc(*glyph) if name != "snapshot" else render(96, 96, [
