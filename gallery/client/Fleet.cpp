@@ -23,6 +23,7 @@ Fleet::Fleet(QObject* parent)
         // Addresses from the range that is kept for documentation.
         camera.address = QStringLiteral("192.0.2.%1").arg(10 + i);
         camera.steerable = i % 4 == 0;
+        camera.events = i % 7 == 2 ? 1 + i % 5 : 0;
         m_cameras.append(camera);
     }
 }
@@ -71,6 +72,15 @@ void Fleet::setOnline(int id, bool online)
     if (index >= 0 && m_cameras.at(index).online != online) {
         m_cameras[index].online = online;
         Q_EMIT onlineChanged(id, online);
+    }
+}
+
+void Fleet::setEvents(int id, int count)
+{
+    const int index = indexOf(id);
+    if (index >= 0 && m_cameras.at(index).events != count) {
+        m_cameras[index].events = count;
+        Q_EMIT eventsChanged(id);
     }
 }
 }

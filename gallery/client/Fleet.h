@@ -16,6 +16,7 @@ struct Camera
     QString address;
     bool online = true;
     bool steerable = false; ///< has a motor
+    int events = 0; ///< that nobody has looked at yet
 };
 
 /// The cameras in the order in which the user has put them. Everything that shows cameras reads here and follows the
@@ -41,10 +42,13 @@ public:
     void remove(int id);
     /// A camera that is offline sends no pictures. It comes back by itself, as a network does, or by this.
     void setOnline(int id, bool online);
+    /// Events that nobody has looked at yet; 0 when somebody has.
+    void setEvents(int id, int count);
 
 Q_SIGNALS:
     void renamed(int id);
     void onlineChanged(int id, bool online);
+    void eventsChanged(int id);
     /// After cameras came, went or moved.
     void orderChanged();
 

@@ -17,6 +17,72 @@
     </message>
 </context>
 <context>
+    <name>client::DevicePanel</name>
+    <message>
+        <source>Search devices</source>
+        <translation>Geräte suchen</translation>
+    </message>
+    <message>
+        <source>Words from name, place or address</source>
+        <translation>Wörter aus Name, Ort oder Adresse</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>Geräte</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Bearbeiten</translation>
+    </message>
+    <message>
+        <source>No device matches the search.</source>
+        <translation>Kein Gerät passt zur Suche.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices</source>
+        <translation>%1 von %2 Geräten</translation>
+    </message>
+    <message>
+        <source>%1 devices</source>
+        <translation>%1 Geräte</translation>
+    </message>
+</context>
+<context>
+    <name>client::DeviceRow</name>
+    <message>
+        <source>%1, online</source>
+        <translation>%1, verbunden</translation>
+    </message>
+    <message>
+        <source>%1, offline</source>
+        <translation>%1, getrennt</translation>
+    </message>
+    <message>
+        <source>Online</source>
+        <translation>Verbunden</translation>
+    </message>
+    <message>
+        <source>Offline</source>
+        <translation>Getrennt</translation>
+    </message>
+    <message>
+        <source>New events</source>
+        <translation>Neue Ereignisse</translation>
+    </message>
+    <message>
+        <source>Name of the camera</source>
+        <translation>Name der Kamera</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Löschen</translation>
+    </message>
+</context>
+<context>
     <name>client::LiveView</name>
     <message>
         <source>Reconnect</source>
@@ -106,6 +172,40 @@
     <message>
         <source>Drag the stick, or a dial sideways.</source>
         <translation>Ziehen Sie den Knüppel, oder einen Regler seitwärts.</translation>
+    </message>
+</context>
+<context>
+    <name>client::ThumbnailModel</name>
+    <message>
+        <source>%1 (offline)</source>
+        <translation>%1 (getrennt)</translation>
+    </message>
+</context>
+<context>
+    <name>client::ThumbnailWall</name>
+    <message>
+        <source>Search pictures</source>
+        <translation>Bilder suchen</translation>
+    </message>
+    <message>
+        <source>Words from name, place or address</source>
+        <translation>Wörter aus Name, Ort oder Adresse</translation>
+    </message>
+    <message>
+        <source>Pictures of all cameras</source>
+        <translation>Bilder aller Kameras</translation>
+    </message>
+    <message>
+        <source>No camera matches the search.</source>
+        <translation>Keine Kamera passt zur Suche.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 cameras</source>
+        <translation>%1 von %2 Kameras</translation>
+    </message>
+    <message>
+        <source>%1 cameras</source>
+        <translation>%1 Kameras</translation>
     </message>
 </context>
 </TS>

@@ -17,6 +17,72 @@
     </message>
 </context>
 <context>
+    <name>client::DevicePanel</name>
+    <message>
+        <source>Search devices</source>
+        <translation>Rechercher un appareil</translation>
+    </message>
+    <message>
+        <source>Words from name, place or address</source>
+        <translation>Mots du nom, du lieu ou de l’adresse</translation>
+    </message>
+    <message>
+        <source>Devices</source>
+        <translation>Appareils</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminé</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Modifier</translation>
+    </message>
+    <message>
+        <source>No device matches the search.</source>
+        <translation>Aucun appareil ne correspond à la recherche.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 devices</source>
+        <translation>%1 appareils sur %2</translation>
+    </message>
+    <message>
+        <source>%1 devices</source>
+        <translation>%1 appareils</translation>
+    </message>
+</context>
+<context>
+    <name>client::DeviceRow</name>
+    <message>
+        <source>%1, online</source>
+        <translation>%1, en ligne</translation>
+    </message>
+    <message>
+        <source>%1, offline</source>
+        <translation>%1, hors ligne</translation>
+    </message>
+    <message>
+        <source>Online</source>
+        <translation>En ligne</translation>
+    </message>
+    <message>
+        <source>Offline</source>
+        <translation>Hors ligne</translation>
+    </message>
+    <message>
+        <source>New events</source>
+        <translation>Nouveaux événements</translation>
+    </message>
+    <message>
+        <source>Name of the camera</source>
+        <translation>Nom de la caméra</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+</context>
+<context>
     <name>client::LiveView</name>
     <message>
         <source>Reconnect</source>
@@ -106,6 +172,40 @@
     <message>
         <source>Drag the stick, or a dial sideways.</source>
         <translation>Faites glisser la manette, ou un bouton vers le côté.</translation>
+    </message>
+</context>
+<context>
+    <name>client::ThumbnailModel</name>
+    <message>
+        <source>%1 (offline)</source>
+        <translation>%1 (hors ligne)</translation>
+    </message>
+</context>
+<context>
+    <name>client::ThumbnailWall</name>
+    <message>
+        <source>Search pictures</source>
+        <translation>Rechercher une image</translation>
+    </message>
+    <message>
+        <source>Words from name, place or address</source>
+        <translation>Mots du nom, du lieu ou de l’adresse</translation>
+    </message>
+    <message>
+        <source>Pictures of all cameras</source>
+        <translation>Images de toutes les caméras</translation>
+    </message>
+    <message>
+        <source>No camera matches the search.</source>
+        <translation>Aucune caméra ne correspond à la recherche.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 cameras</source>
+        <translation>%1 caméras sur %2</translation>
+    </message>
+    <message>
+        <source>%1 cameras</source>
+        <translation>%1 caméras</translation>
     </message>
 </context>
 </TS>
