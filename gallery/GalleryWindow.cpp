@@ -25,6 +25,7 @@
 #include "Page.h"
 #include "PageList.h"
 #include "SignalLog.h"
+#include "client/ClientWindow.h"
 
 namespace gallery
 {
@@ -37,7 +38,6 @@ const int s_pageRole = Qt::UserRole;
 const QSize s_size(1240, 900);
 const int s_margin = 20;
 const int s_logRowHeight = 22;
-const int s_logRows = 5;
 
 QLabel* roleLabel(const char* role)
 {
@@ -54,6 +54,7 @@ GalleryWindow::GalleryWindow(SignalLog& log, QWidget* parent)
     const QSize room = first ? first->availableSize() : s_size;
     const bool isOffscreen = QGuiApplication::platformName() == QLatin1String("offscreen");
     resize(s_size.boundedTo(isOffscreen ? s_size : room * 95 / 100));
+    client::ClientWindow::initCatalogues();
 }
 
 GalleryWindow::~GalleryWindow() = default;
@@ -147,20 +148,19 @@ void GalleryWindow::rebuild()
     m_scroll->setWidgetResizable(true);
     m_pageLayout->addWidget(m_scroll, 1);
 
-    auto* upright = new QSplitter(Qt::Vertical);
-    upright->addWidget(pagePanel);
-    upright->addWidget(makeLog());
-    upright->setStretchFactor(0, 1);
-    upright->setStretchFactor(1, 0);
-    upright->setSizes({10000, 1});
-    upright->setChildrenCollapsible(false);
+    m_upright = new QSplitter(Qt::Vertical);
+    m_upright->addWidget(pagePanel);
+    m_upright->addWidget(makeLog());
+    m_upright->setStretchFactor(0, 1);
+    m_upright->setStretchFactor(1, 0);
+    m_upright->setChildrenCollapsible(false);
 
     auto* body = new QWidget;
     auto* bodyLayout = new QHBoxLayout(body);
     bodyLayout->setContentsMargins(0, 0, 0, 0);
     bodyLayout->setSpacing(0);
     bodyLayout->addWidget(makePageList());
-    bodyLayout->addWidget(upright, 1);
+    bodyLayout->addWidget(m_upright, 1);
 
     auto* all = new QWidget;
     auto* layout = new QVBoxLayout(all);
@@ -169,6 +169,10 @@ void GalleryWindow::rebuild()
     layout->addWidget(makeTopBar());
     layout->addWidget(body, 1);
 
+    const QPointer<QWidget> focus = m_page && m_page->keepsItself() ? m_page->focusWidget() : nullptr;
+    if (m_page && m_page->keepsItself()) {
+        leavePage();
+    }
     // The old widgets may be on the call stack: a combo box of the top bar asks for this.
     if (QWidget* old = takeCentralWidget()) {
         old->hide();
@@ -177,6 +181,9 @@ void GalleryWindow::rebuild()
     m_page = nullptr;
     setCentralWidget(all);
     showPage(m_index);
+    if (focus) {
+        focus->setFocus();
+    }
 }
 
 QWidget* GalleryWindow::makeTopBar()
@@ -322,30 +329,84 @@ QWidget* GalleryWindow::makeLog()
     layout->setSpacing(8);
     layout->addLayout(row);
     layout->addWidget(table);
-    // Whole rows, so that the end of the list does not stand below half a row.
     table->ensurePolished();
-    table->setMinimumHeight(table->horizontalHeader()->sizeHint().height() + s_logRows * s_logRowHeight
-                            + 2 * table->frameWidth());
+    m_logTable = table;
     return box;
+}
+
+void GalleryWindow::setLogRows(int rows)
+{
+    // Whole rows, so that the end of the list does not stand below half a row.
+    m_logTable->setMinimumHeight(m_logTable->horizontalHeader()->sizeHint().height() + rows * s_logRowHeight
+                                 + 2 * m_logTable->frameWidth());
+    m_upright->setSizes({10000, 1});
 }
 
 void GalleryWindow::showPage(int index)
 {
-    if (index < 0 || index >= pages().size() || !m_pageLayout) {
+    if (index < 0 || index >= pages().size()) {
         return;
     }
     m_index = index;
-    delete m_page;
+    if (!m_pageLayout) {
+        return; // there is no language yet
+    }
+    leavePage();
     const PageEntry& entry = pages().at(index);
     m_title->setText(entry.titleText());
     m_description->setText(entry.descriptionText());
-    m_page = entry.make(m_log, nullptr);
-    m_scroll->setWidget(m_page);
+    putPage(keptPage(index));
     for (int row = 0; row < m_list->count(); ++row) {
         if (m_list->item(row)->data(s_pageRole).toInt() == index) {
             m_list->setCurrentRow(row);
         }
     }
+}
+
+Page* GalleryWindow::keptPage(int index)
+{
+    if (m_kept.value(index)) {
+        return m_kept.value(index);
+    }
+    Page* page = pages().at(index).make(m_log, nullptr);
+    if (page->keepsItself()) {
+        m_kept.insert(index, page);
+    }
+    // Queued: the page that asks may be replaced on it.
+    connect(page, &Page::languageWanted, this, &GalleryWindow::setLanguage, Qt::QueuedConnection);
+    connect(page, &Page::themeWanted, this, [this](const QString& name) {
+        bool ok = false;
+        const zelkov::theme::Name theme = themeFromName(name, &ok);
+        if (ok) {
+            setTheme(theme);
+        }
+    }, Qt::QueuedConnection);
+    return page;
+}
+
+void GalleryWindow::putPage(Page* page)
+{
+    m_page = page;
+    setLogRows(page->logRows());
+    m_scroll->setVisible(!page->keepsItself());
+    if (page->keepsItself()) {
+        m_pageLayout->addWidget(page, 1);
+        page->show();
+    } else {
+        m_scroll->setWidget(page);
+    }
+}
+
+void GalleryWindow::leavePage()
+{
+    if (m_page && m_page->keepsItself()) {
+        // Never without a window: what the page has put over the window goes by that.
+        m_page->setParent(this);
+        m_page->hide();
+    } else {
+        delete m_page;
+    }
+    m_page = nullptr;
 }
 
 void GalleryWindow::restartWithScale(const QString& factor)

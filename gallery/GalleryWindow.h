@@ -2,6 +2,7 @@
 // The main window: pages on the left, the chosen page on the right, the signals below, switches above.
 #pragma once
 
+#include <QtCore/QMap>
 #include <QtCore/QPointer>
 #include <QtCore/QTranslator>
 #include <QtWidgets/QMainWindow>
@@ -12,6 +13,7 @@ class QComboBox;
 class QLabel;
 class QListWidget;
 class QScrollArea;
+class QSplitter;
 class QTableView;
 class QVBoxLayout;
 
@@ -42,8 +44,13 @@ public:
     static zelkov::theme::Name themeFromName(const QString& name, bool* ok);
 
 private:
-    // All widgets are made anew for another language or theme, so nothing needs to re-translate itself.
+    // All widgets are made anew for another language or theme, so nothing needs to re-translate itself. Pages that
+    // keep themselves are carried over.
     void rebuild();
+    void putPage(Page* page);
+    void leavePage();
+    void setLogRows(int rows);
+    Page* keptPage(int index);
     QWidget* makeTopBar();
     QWidget* makePageList();
     QWidget* makeLog();
@@ -60,6 +67,9 @@ private:
     QLabel* m_description = nullptr;
     QVBoxLayout* m_pageLayout = nullptr;
     QScrollArea* m_scroll = nullptr;
+    QTableView* m_logTable = nullptr;
+    QSplitter* m_upright = nullptr;
     QPointer<Page> m_page;
+    QMap<int, QPointer<Page>> m_kept;
 };
 }

@@ -13,7 +13,8 @@ class Hand;
 class SignalLog;
 
 /// A page shows one family of widgets. It is built anew whenever the language or the theme changes, so it
-/// sets its texts once, in its constructor, and lives only from one switch to the next.
+/// sets its texts once, in its constructor, and lives only from one switch to the next. A page that keeps itself is
+/// the exception.
 ///
 /// A new page needs a class like this one, a line in PageList.cpp and a line in CMakeLists.txt.
 class Page : public QWidget
@@ -26,6 +27,17 @@ public:
     /// Uses the widgets for a second or two, with real events, so that a picture of the page shows an
     /// interesting state. The hand plays the steps after this has returned.
     virtual void rehearse(Hand& hand);
+
+    /// Whether the page is made once, keeps its state and follows language and theme by itself. It then has all the
+    /// room below the description, without a scroll area around it.
+    virtual bool keepsItself() const { return false; }
+    /// How many rows of the signal log are to be seen at least.
+    virtual int logRows() const { return 5; }
+
+Q_SIGNALS:
+    // For pages that offer the choice themselves, by the names that --theme and --lang take.
+    void themeWanted(const QString& name);
+    void languageWanted(const QString& language);
 
 protected:
     /// From now on every signal of the object is written to the log under the name. Signals that come in

@@ -7,6 +7,7 @@
 #include "pages/BadgesPage.h"
 #include "pages/CameraWallPage.h"
 #include "pages/ClickVariantsPage.h"
+#include "pages/ClientPage.h"
 #include "pages/CountingLinesPage.h"
 #include "pages/DeviceBrowserPage.h"
 #include "pages/EditsPage.h"
@@ -48,6 +49,12 @@ QString translated(const char* text)
 const QVector<PageEntry>& pages()
 {
     static const QVector<PageEntry> list = {
+        {"client", QT_TRANSLATE_NOOP("gallery::PageList", "Cameras"),
+         QT_TRANSLATE_NOOP("gallery::PageList", "Camera client"),
+         QT_TRANSLATE_NOOP("gallery::PageList",
+                           "A whole client made of the library. Log in as user with camera1!, or as admin with "
+                           "camera2!, who may export, steer and edit."),
+         &make<ClientPage>},
         {"camera-wall", QT_TRANSLATE_NOOP("gallery::PageList", "Cameras"),
          QT_TRANSLATE_NOOP("gallery::PageList", "Camera wall"),
          QT_TRANSLATE_NOOP("gallery::PageList",

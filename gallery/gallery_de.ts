@@ -1145,6 +1145,14 @@
         <source>Every row that a popover can hold: texts, choices, values and submenus. What is performed stands in the log, with its value and flags.</source>
         <translation>Jede Zeile, die ein Popover enthalten kann: Texte, Auswahl, Werte und Untermenüs. Was ausgeführt wird, steht mit Wert und Flags im Protokoll.</translation>
     </message>
+    <message>
+        <source>Camera client</source>
+        <translation>Kamera-Client</translation>
+    </message>
+    <message>
+        <source>A whole client made of the library. Log in as user with camera1!, or as admin with camera2!, who may export, steer and edit.</source>
+        <translation>Ein ganzer Client aus der Bibliothek. Anmelden als user mit camera1! oder als admin mit camera2!, der exportieren, steuern und ändern darf.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>

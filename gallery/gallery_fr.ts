@@ -1145,6 +1145,14 @@
         <source>Every row that a popover can hold: texts, choices, values and submenus. What is performed stands in the log, with its value and flags.</source>
         <translation>Chaque ligne qu&apos;un popover peut contenir : textes, choix, valeurs et sous-menus. Ce qui est exécuté figure dans le journal, avec sa valeur et ses indicateurs.</translation>
     </message>
+    <message>
+        <source>Camera client</source>
+        <translation>Client de caméras</translation>
+    </message>
+    <message>
+        <source>A whole client made of the library. Log in as user with camera1!, or as admin with camera2!, who may export, steer and edit.</source>
+        <translation>Un client entier fait avec la bibliothèque. Connectez-vous comme user avec camera1! ou comme admin avec camera2!, qui peut exporter, piloter et modifier.</translation>
+    </message>
 </context>
 <context>
     <name>gallery::PagesPage</name>

@@ -142,8 +142,8 @@ int main(int argc, char* argv[])
     }
     const DeferredDeletions deletions;
     gallery::GalleryWindow window(log);
-    window.setLanguage(parser.value(language));
     window.showPage(index);
+    window.setLanguage(parser.value(language));
     window.setTheme(themeName);
     if (!parser.isSet(shots)) {
         window.show();

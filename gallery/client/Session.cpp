@@ -2,32 +2,44 @@
 // Who is logged in.
 #include "Session.h"
 
-#include <memory>
-
 #include "input/CustomClickAdapter.h"
+#include "popover/Item.h"
 
 namespace client
 {
 Session::Session(QObject* parent)
     : QObject(parent)
+    , m_passwords{{QStringLiteral("user"), {QStringLiteral("camera1!")}},
+          {QStringLiteral("admin"), {QStringLiteral("camera2!")}}}
+    , m_manager(this, [](vx::ISecurityManager*) {}) // not owned
 {
-    vx::CustomClickAdapter::setSecurityManager(std::shared_ptr<vx::ISecurityManager>(this, [](vx::ISecurityManager*) {})); // not owned
+    takeOver();
 }
 
 Session::~Session()
 {
-    vx::CustomClickAdapter::setSecurityManager(nullptr);
+    if (vx::CustomClickAdapter::securityManager() == m_manager) {
+        vx::CustomClickAdapter::setSecurityManager(nullptr);
+    }
+    if (vx::PopoverWidget::Item::securityManager() == m_manager) {
+        vx::PopoverWidget::Item::setSecurityManager(nullptr);
+    }
+}
+
+void Session::takeOver()
+{
+    vx::CustomClickAdapter::setSecurityManager(m_manager);
+    vx::PopoverWidget::Item::setSecurityManager(m_manager);
 }
 
 bool Session::logIn(const QString& user, const QString& password)
 {
-    const bool isAdministrator = user == QLatin1String("admin") && password == QLatin1String("camera2!");
-    const bool isUser = user == QLatin1String("user") && password == QLatin1String("camera1!");
-    if (!isAdministrator && !isUser) {
+    const QStringList known = m_passwords.value(user);
+    if (known.isEmpty() || known.last() != password) {
         return false;
     }
     m_user = user;
-    m_role = isAdministrator ? Role::Administrator : Role::User;
+    m_role = user == QLatin1String("admin") ? Role::Administrator : Role::User;
     Q_EMIT roleChanged();
     return true;
 }
@@ -45,6 +57,20 @@ void Session::setRole(Role role)
         m_role = role;
         Q_EMIT roleChanged();
     }
+}
+
+bool Session::setPassword(const QString& password)
+{
+    if (m_role == Role::None || wasUsed(password)) {
+        return false;
+    }
+    m_passwords[m_user].append(password);
+    return true;
+}
+
+bool Session::wasUsed(const QString& password) const
+{
+    return m_passwords.value(m_user).contains(password);
 }
 
 bool Session::isRightRefused(const QString& right, bool, bool, bool)

@@ -2,6 +2,21 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="fr">
 <context>
+    <name>client::BarEditor</name>
+    <message>
+        <source>Drag tools into the bar, out of it, or to another place.</source>
+        <translation>Glissez des outils dans la barre, hors d’elle ou à une autre place.</translation>
+    </message>
+    <message>
+        <source>Reset</source>
+        <translation>Rétablir</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminé</translation>
+    </message>
+</context>
+<context>
     <name>client::CountingTools</name>
     <message>
         <source>Drag the ends of the line in the picture, or change the numbers.</source>
@@ -14,6 +29,164 @@
     <message>
         <source>Inside</source>
         <translation>Intérieur</translation>
+    </message>
+</context>
+<context>
+    <name>client::Desk</name>
+    <message>
+        <source>Drag a rectangle in the chosen view.</source>
+        <translation>Tracez un rectangle dans la vue choisie.</translation>
+    </message>
+    <message>
+        <source>Drag the ends of the line in the chosen view.</source>
+        <translation>Déplacez les extrémités de la ligne dans la vue choisie.</translation>
+    </message>
+    <message>
+        <source>The export is complete.</source>
+        <translation>L’export est terminé.</translation>
+    </message>
+    <message>
+        <source>The export was stopped.</source>
+        <translation>L’export a été arrêté.</translation>
+    </message>
+    <message>
+        <source>Marked in %1: %2 x %3 pixels at %4, %5</source>
+        <translation>Marqué dans %1 : %2 x %3 pixels en %4, %5</translation>
+    </message>
+    <message>
+        <source>A picture of %1 was taken.</source>
+        <translation>Une image de %1 a été prise.</translation>
+    </message>
+    <message>
+        <source>%1 is back.</source>
+        <translation>%1 est de retour.</translation>
+    </message>
+    <message>
+        <source>%1 has gone.</source>
+        <translation>%1 ne répond plus.</translation>
+    </message>
+    <message>
+        <source>Main building</source>
+        <translation>Bâtiment principal</translation>
+    </message>
+    <message>
+        <source>Recording of %1</source>
+        <translation>Enregistrement du %1</translation>
+    </message>
+    <message>
+        <source>Choose a camera first.</source>
+        <translation>Choisissez d’abord une caméra.</translation>
+    </message>
+    <message>
+        <source>%1, %2, %3</source>
+        <translation>%1, %2, %3</translation>
+    </message>
+    <message>
+        <source>online</source>
+        <translation>en ligne</translation>
+    </message>
+    <message>
+        <source>offline</source>
+        <translation>hors ligne</translation>
+    </message>
+    <message>
+        <source>%1 cameras</source>
+        <translation>%1 caméras</translation>
+    </message>
+    <message>
+        <source>%1 frames/s</source>
+        <translation>%1 images/s</translation>
+    </message>
+    <message>
+        <source>User</source>
+        <translation>Utilisateur</translation>
+    </message>
+    <message>
+        <source>Administrator</source>
+        <translation>Administrateur</translation>
+    </message>
+    <message>
+        <source>New password...</source>
+        <translation>Nouveau mot de passe...</translation>
+    </message>
+    <message>
+        <source>Log out</source>
+        <translation>Se déconnecter</translation>
+    </message>
+    <message>
+        <source>Views</source>
+        <translation>Vues</translation>
+    </message>
+    <message>
+        <source>%1 views</source>
+        <translation>%1 vues</translation>
+    </message>
+</context>
+<context>
+    <name>client::DeskBar</name>
+    <message>
+        <source>Number of views</source>
+        <translation>Nombre de vues</translation>
+    </message>
+    <message>
+        <source>Back to the pictures</source>
+        <translation>Retour aux images</translation>
+    </message>
+    <message>
+        <source>All cameras as thumbnails</source>
+        <translation>Toutes les caméras en miniatures</translation>
+    </message>
+    <message>
+        <source>Live pictures; click for the recordings</source>
+        <translation>Images en direct ; un clic montre les enregistrements</translation>
+    </message>
+    <message>
+        <source>Recordings; click for live</source>
+        <translation>Enregistrements ; un clic montre le direct</translation>
+    </message>
+    <message>
+        <source>Mark a region</source>
+        <translation>Marquer une zone</translation>
+    </message>
+    <message>
+        <source>Counting line</source>
+        <translation>Ligne de comptage</translation>
+    </message>
+    <message>
+        <source>Export a recording</source>
+        <translation>Exporter un enregistrement</translation>
+    </message>
+    <message>
+        <source>Steer the camera</source>
+        <translation>Piloter la caméra</translation>
+    </message>
+    <message>
+        <source>Cut the line of the camera</source>
+        <translation>Couper la ligne de la caméra</translation>
+    </message>
+    <message>
+        <source>Restore the line of the camera</source>
+        <translation>Rétablir la ligne de la caméra</translation>
+    </message>
+    <message>
+        <source>Tools</source>
+        <translation>Outils</translation>
+    </message>
+    <message>
+        <source>LIVE</source>
+        <translation>DIRECT</translation>
+    </message>
+    <message>
+        <source>RECORDED</source>
+        <translation>ENREGISTRÉ</translation>
+    </message>
+    <message>
+        <source>%1 (administrators only)</source>
+        <translation>%1 (administrateurs seulement)</translation>
+    </message>
+    <message>
+        <source>Settings</source>
+        <translation>Réglages</translation>
     </message>
 </context>
 <context>
@@ -101,10 +274,92 @@
     </message>
 </context>
 <context>
+    <name>client::LoginPanel</name>
+    <message>
+        <source>Camera client</source>
+        <translation>Client de caméras</translation>
+    </message>
+    <message>
+        <source>Log in to see the cameras.</source>
+        <translation>Connectez-vous pour voir les caméras.</translation>
+    </message>
+    <message>
+        <source>Name</source>
+        <translation>Nom</translation>
+    </message>
+    <message>
+        <source>Password</source>
+        <translation>Mot de passe</translation>
+    </message>
+    <message>
+        <source>Log in</source>
+        <translation>Se connecter</translation>
+    </message>
+    <message>
+        <source>New password...</source>
+        <translation>Nouveau mot de passe...</translation>
+    </message>
+    <message>
+        <source>For a look around: user with camera1!, or admin with camera2!</source>
+        <translation>Pour regarder : user avec camera1! ou admin avec camera2!</translation>
+    </message>
+    <message>
+        <source>Name and password do not match.</source>
+        <translation>Le nom et le mot de passe ne correspondent pas.</translation>
+    </message>
+</context>
+<context>
     <name>client::MarkingTool</name>
     <message>
         <source>Region</source>
         <translation>Zone</translation>
+    </message>
+</context>
+<context>
+    <name>client::PasswordPanel</name>
+    <message>
+        <source>New password</source>
+        <translation>Nouveau mot de passe</translation>
+    </message>
+    <message>
+        <source>A new password for %1, twice. The rules below turn green as they are met.</source>
+        <translation>Un nouveau mot de passe pour %1, deux fois. Les règles deviennent vertes une fois remplies.</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Once more</source>
+        <translation>Encore une fois</translation>
+    </message>
+    <message>
+        <source>%1 characters or more</source>
+        <translation>au moins %1 caractères</translation>
+    </message>
+    <message>
+        <source>a small and a capital letter</source>
+        <translation>une minuscule et une majuscule</translation>
+    </message>
+    <message>
+        <source>a digit and a letter</source>
+        <translation>un chiffre et une lettre</translation>
+    </message>
+    <message>
+        <source>a special character</source>
+        <translation>un caractère spécial</translation>
+    </message>
+    <message>
+        <source>not used before</source>
+        <translation>jamais utilisé</translation>
+    </message>
+    <message>
+        <source>the same both times</source>
+        <translation>identique les deux fois</translation>
     </message>
 </context>
 <context>
@@ -172,6 +427,181 @@
     <message>
         <source>Drag the stick, or a dial sideways.</source>
         <translation>Faites glisser la manette, ou un bouton vers le côté.</translation>
+    </message>
+</context>
+<context>
+    <name>client::SettingsPopover</name>
+    <message>
+        <source>Settings</source>
+        <translation>Réglages</translation>
+    </message>
+    <message>
+        <source>Go to a camera</source>
+        <translation>Aller à une caméra</translation>
+    </message>
+    <message>
+        <source>Customise the tool bar...</source>
+        <translation>Personnaliser la barre d’outils...</translation>
+    </message>
+    <message>
+        <source>Log out</source>
+        <translation>Se déconnecter</translation>
+    </message>
+    <message>
+        <source>Views</source>
+        <translation>Vues</translation>
+    </message>
+    <message>
+        <source>Device list</source>
+        <translation>Liste des appareils</translation>
+    </message>
+    <message>
+        <source>left</source>
+        <translation>à gauche</translation>
+    </message>
+    <message>
+        <source>right</source>
+        <translation>à droite</translation>
+    </message>
+    <message>
+        <source>hidden</source>
+        <translation>masquée</translation>
+    </message>
+    <message>
+        <source>Time line</source>
+        <translation>Ligne de temps</translation>
+    </message>
+    <message>
+        <source>shown</source>
+        <translation>affichée</translation>
+    </message>
+    <message>
+        <source>Labels in the views</source>
+        <translation>Légendes des vues</translation>
+    </message>
+    <message>
+        <source>All labels</source>
+        <translation>Tout</translation>
+    </message>
+    <message>
+        <source>Names</source>
+        <translation>Noms</translation>
+    </message>
+    <message>
+        <source>Times</source>
+        <translation>Heures</translation>
+    </message>
+    <message>
+        <source>Badges</source>
+        <translation>Pastilles</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Langue</translation>
+    </message>
+    <message>
+        <source>Appearance</source>
+        <translation>Apparence</translation>
+    </message>
+    <message>
+        <source>Dark</source>
+        <translation>Sombre</translation>
+    </message>
+    <message>
+        <source>Light</source>
+        <translation>Clair</translation>
+    </message>
+    <message>
+        <source>Recordings</source>
+        <translation>Enregistrements</translation>
+    </message>
+    <message>
+        <source>live</source>
+        <translation>direct</translation>
+    </message>
+    <message>
+        <source>recorded</source>
+        <translation>enregistré</translation>
+    </message>
+    <message>
+        <source>All views show this moment of their recordings, within the last 24 hours.</source>
+        <translation>Toutes les vues montrent ce moment de leurs enregistrements des dernières 24 heures.</translation>
+    </message>
+    <message>
+        <source>Moment</source>
+        <translation>Moment</translation>
+    </message>
+    <message>
+        <source>Back to live</source>
+        <translation>Retour au direct</translation>
+    </message>
+    <message>
+        <source>Cameras and site</source>
+        <translation>Caméras et site</translation>
+    </message>
+    <message>
+        <source>Name of the shown</source>
+        <translation>Nom des caméras</translation>
+    </message>
+    <message>
+        <source>New name</source>
+        <translation>Nouveau nom</translation>
+    </message>
+    <message>
+        <source>several values</source>
+        <translation>plusieurs valeurs</translation>
+    </message>
+    <message>
+        <source>Main building</source>
+        <translation>Bâtiment principal</translation>
+    </message>
+    <message>
+        <source>Site</source>
+        <translation>Site</translation>
+    </message>
+    <message>
+        <source>Outage of a cut line</source>
+        <translation>Durée d’une coupure</translation>
+    </message>
+    <message>
+        <source> s</source>
+        <translation> s</translation>
+    </message>
+    <message>
+        <source>Account</source>
+        <translation>Compte</translation>
+    </message>
+    <message>
+        <source>Logged in as %1, an administrator.</source>
+        <translation>Connecté comme %1, administrateur.</translation>
+    </message>
+    <message>
+        <source>Logged in as %1.</source>
+        <translation>Connecté comme %1.</translation>
+    </message>
+    <message>
+        <source>Shown name</source>
+        <translation>Nom affiché</translation>
+    </message>
+    <message>
+        <source>Stay logged in</source>
+        <translation>Rester connecté</translation>
+    </message>
+    <message>
+        <source>Log out after</source>
+        <translation>Se déconnecter après</translation>
+    </message>
+    <message>
+        <source>s</source>
+        <translation>s</translation>
+    </message>
+    <message>
+        <source>min</source>
+        <translation>min</translation>
+    </message>
+    <message>
+        <source>New password...</source>
+        <translation>Nouveau mot de passe...</translation>
     </message>
 </context>
 <context>

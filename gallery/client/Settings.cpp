@@ -1,0 +1,7 @@
+// SPDX-License-Identifier: MIT
+// What the user has chosen about the desk.
+#include "Settings.h"
+
+namespace client
+{
+}
