@@ -214,6 +214,11 @@ private:
         }
     }
 
+    static QPoint near(const QPoint& place)
+    {
+        return {qBound(-100000, place.x(), 100000), qBound(-100000, place.y(), 100000)};
+    }
+
     QVariant randomValue(int type)
     {
         const QVariantList values = extremeValues(type);
@@ -224,6 +229,13 @@ private:
         }
         if (type == QMetaType::QSize) {
             return value.toSize().boundedTo(QSize(100, 100));
+        }
+        // Nor places from where Qt itself cannot count to the far corner of a rectangle.
+        if (type == QMetaType::QPoint) {
+            return near(value.toPoint());
+        }
+        if (type == QMetaType::QRect) {
+            return QRect(near(value.toRect().topLeft()), value.toRect().size().boundedTo(QSize(100, 100)));
         }
         return value;
     }
