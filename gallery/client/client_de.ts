@@ -256,6 +256,103 @@
     </message>
 </context>
 <context>
+    <name>client::EventStripe</name>
+    <message>
+        <source>No events within the last 24 hours</source>
+        <translation>Keine Ereignisse in den letzten 24 Stunden</translation>
+    </message>
+    <message>
+        <source>Alarm</source>
+        <translation>Alarm</translation>
+    </message>
+    <message>
+        <source>Movement</source>
+        <translation>Bewegung</translation>
+    </message>
+</context>
+<context>
+    <name>client::ExportPopover</name>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Export</translation>
+    </message>
+    <message>
+        <source>Cameras</source>
+        <translation>Kameras</translation>
+    </message>
+    <message>
+        <source>MP4, for any player</source>
+        <translation>MP4, für jeden Player</translation>
+    </message>
+    <message>
+        <source>MKV, smaller</source>
+        <translation>MKV, kleiner</translation>
+    </message>
+    <message>
+        <source>As recorded</source>
+        <translation>Wie aufgezeichnet</translation>
+    </message>
+    <message>
+        <source>Quality</source>
+        <translation>Qualität</translation>
+    </message>
+    <message>
+        <source>With sound</source>
+        <translation>Mit Ton</translation>
+    </message>
+    <message>
+        <source>Time in the picture</source>
+        <translation>Zeit im Bild</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>Von</translation>
+    </message>
+    <message>
+        <source>To</source>
+        <translation>Bis</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>Dateiname</translation>
+    </message>
+    <message>
+        <source>Protect by a password</source>
+        <translation>Mit Passwort schützen</translation>
+    </message>
+    <message>
+        <source>Password</source>
+        <translation>Passwort</translation>
+    </message>
+    <message>
+        <source>All (%1)</source>
+        <translation>Alle (%1)</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+</context>
+<context>
+    <name>client::ExportRun</name>
+    <message>
+        <source>Exporting %1</source>
+        <translation>%1 wird exportiert</translation>
+    </message>
+    <message>
+        <source>Running for %1</source>
+        <translation>Läuft seit %1</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+</context>
+<context>
     <name>client::LiveView</name>
     <message>
         <source>Reconnect</source>
@@ -427,6 +524,56 @@
     <message>
         <source>Drag the stick, or a dial sideways.</source>
         <translation>Ziehen Sie den Knüppel, oder einen Regler seitwärts.</translation>
+    </message>
+</context>
+<context>
+    <name>client::RecordStripes</name>
+    <message>
+        <source>Export finished</source>
+        <translation>Export fertig</translation>
+    </message>
+</context>
+<context>
+    <name>client::RecordTimeLine</name>
+    <message>
+        <source>Live · %1</source>
+        <translation>Live · %1</translation>
+    </message>
+    <message>
+        <source>%1 · %2 ago</source>
+        <translation>%1 · vor %2</translation>
+    </message>
+    <message>
+        <source>Export %1 to %2 (%3)</source>
+        <translation>Export %1 bis %2 (%3)</translation>
+    </message>
+    <message>
+        <source>Drag the flags to choose what is exported.</source>
+        <translation>Die Fahnen bestimmen, was exportiert wird.</translation>
+    </message>
+    <message>
+        <source>Export...</source>
+        <translation>Exportieren...</translation>
+    </message>
+    <message>
+        <source>You have no right to export.</source>
+        <translation>Sie haben kein Recht zum Export.</translation>
+    </message>
+    <message>
+        <source>Live</source>
+        <translation>Live</translation>
+    </message>
+    <message>
+        <source>Back to what the cameras show now</source>
+        <translation>Zurück zu dem, was die Kameras jetzt zeigen</translation>
+    </message>
+    <message>
+        <source>Go to</source>
+        <translation>Gehe zu</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Datum und Zeit</translation>
     </message>
 </context>
 <context>
@@ -636,6 +783,21 @@
     <message>
         <source>%1 cameras</source>
         <translation>%1 Kameras</translation>
+    </message>
+</context>
+<context>
+    <name>client::TimeTrack</name>
+    <message>
+        <source>Moment that is shown. A double click asks for another one.</source>
+        <translation>Gezeigter Zeitpunkt. Ein Doppelklick fragt nach einem anderen.</translation>
+    </message>
+    <message>
+        <source>Start of the export</source>
+        <translation>Anfang des Exports</translation>
+    </message>
+    <message>
+        <source>End of the export</source>
+        <translation>Ende des Exports</translation>
     </message>
 </context>
 </TS>

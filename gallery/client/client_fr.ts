@@ -256,6 +256,103 @@
     </message>
 </context>
 <context>
+    <name>client::EventStripe</name>
+    <message>
+        <source>No events within the last 24 hours</source>
+        <translation>Aucun événement ces dernières 24 heures</translation>
+    </message>
+    <message>
+        <source>Alarm</source>
+        <translation>Alarme</translation>
+    </message>
+    <message>
+        <source>Movement</source>
+        <translation>Mouvement</translation>
+    </message>
+</context>
+<context>
+    <name>client::ExportPopover</name>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Export</source>
+        <translation>Exporter</translation>
+    </message>
+    <message>
+        <source>Cameras</source>
+        <translation>Caméras</translation>
+    </message>
+    <message>
+        <source>MP4, for any player</source>
+        <translation>MP4, pour tout lecteur</translation>
+    </message>
+    <message>
+        <source>MKV, smaller</source>
+        <translation>MKV, plus petit</translation>
+    </message>
+    <message>
+        <source>As recorded</source>
+        <translation>Tel qu&apos;enregistré</translation>
+    </message>
+    <message>
+        <source>Quality</source>
+        <translation>Qualité</translation>
+    </message>
+    <message>
+        <source>With sound</source>
+        <translation>Avec le son</translation>
+    </message>
+    <message>
+        <source>Time in the picture</source>
+        <translation>Heure dans l&apos;image</translation>
+    </message>
+    <message>
+        <source>From</source>
+        <translation>De</translation>
+    </message>
+    <message>
+        <source>To</source>
+        <translation>À</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>Nom du fichier</translation>
+    </message>
+    <message>
+        <source>Protect by a password</source>
+        <translation>Protéger par mot de passe</translation>
+    </message>
+    <message>
+        <source>Password</source>
+        <translation>Mot de passe</translation>
+    </message>
+    <message>
+        <source>All (%1)</source>
+        <translation>Toutes (%1)</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+</context>
+<context>
+    <name>client::ExportRun</name>
+    <message>
+        <source>Exporting %1</source>
+        <translation>Exportation de %1</translation>
+    </message>
+    <message>
+        <source>Running for %1</source>
+        <translation>En cours depuis %1</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+</context>
+<context>
     <name>client::LiveView</name>
     <message>
         <source>Reconnect</source>
@@ -427,6 +524,56 @@
     <message>
         <source>Drag the stick, or a dial sideways.</source>
         <translation>Faites glisser la manette, ou un bouton vers le côté.</translation>
+    </message>
+</context>
+<context>
+    <name>client::RecordStripes</name>
+    <message>
+        <source>Export finished</source>
+        <translation>Exportation terminée</translation>
+    </message>
+</context>
+<context>
+    <name>client::RecordTimeLine</name>
+    <message>
+        <source>Live · %1</source>
+        <translation>Direct · %1</translation>
+    </message>
+    <message>
+        <source>%1 · %2 ago</source>
+        <translation>%1 · il y a %2</translation>
+    </message>
+    <message>
+        <source>Export %1 to %2 (%3)</source>
+        <translation>Export de %1 à %2 (%3)</translation>
+    </message>
+    <message>
+        <source>Drag the flags to choose what is exported.</source>
+        <translation>Les drapeaux choisissent ce qui est exporté.</translation>
+    </message>
+    <message>
+        <source>Export...</source>
+        <translation>Exporter...</translation>
+    </message>
+    <message>
+        <source>You have no right to export.</source>
+        <translation>Vous n&apos;avez pas le droit d&apos;exporter.</translation>
+    </message>
+    <message>
+        <source>Live</source>
+        <translation>Direct</translation>
+    </message>
+    <message>
+        <source>Back to what the cameras show now</source>
+        <translation>Retour à ce que les caméras montrent maintenant</translation>
+    </message>
+    <message>
+        <source>Go to</source>
+        <translation>Aller à</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Date et heure</translation>
     </message>
 </context>
 <context>
@@ -636,6 +783,21 @@
     <message>
         <source>%1 cameras</source>
         <translation>%1 caméras</translation>
+    </message>
+</context>
+<context>
+    <name>client::TimeTrack</name>
+    <message>
+        <source>Moment that is shown. A double click asks for another one.</source>
+        <translation>Moment affiché. Un double clic en demande un autre.</translation>
+    </message>
+    <message>
+        <source>Start of the export</source>
+        <translation>Début de l&apos;exportation</translation>
+    </message>
+    <message>
+        <source>End of the export</source>
+        <translation>Fin de l&apos;exportation</translation>
     </message>
 </context>
 </TS>
