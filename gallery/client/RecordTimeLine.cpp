@@ -50,7 +50,7 @@ RecordTimeLine::RecordTimeLine(Fleet& fleet, QWidget* parent)
     m_range->setProperty("role", QStringLiteral("hint"));
     m_range->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     m_export->setObjectName(QStringLiteral("timeLineExportButton"));
-    m_liveButton->setObjectName(QStringLiteral("liveButton"));
+    m_liveButton->setObjectName(QStringLiteral("timeLineLiveButton"));
     m_liveButton->setCheckable(true);
     for (QPushButton* button : {m_export, m_liveButton}) {
         button->setFocusPolicy(Qt::NoFocus);

@@ -268,7 +268,7 @@ void TestRecordStripes::aDragTellsTimesInOrderWithinTheDay()
     }
     QVERIFY(told.constLast() < now - s_day + 60 * 1000);
     QVERIFY(!scene.stripes->timeLine()->isLive());
-    QVERIFY(!scene.find<QPushButton>("liveButton")->isChecked());
+    QVERIFY(!scene.find<QPushButton>("timeLineLiveButton")->isChecked());
 }
 
 void TestRecordStripes::aDragFarOffTheScaleIsFine()
@@ -314,15 +314,15 @@ void TestRecordStripes::theLiveButtonGoesToTheEnd()
     QVERIFY(!scene.stripes->timeLine()->isLive());
     SignalRecorder recorder(scene.stripes);
     Pointer pointer(scene.window.get());
-    pointer.click(scene.middleOf(scene.find<QPushButton>("liveButton")));
+    pointer.click(scene.middleOf(scene.find<QPushButton>("timeLineLiveButton")));
     QCOMPARE(recorder.names(), QStringList(QStringLiteral("liveWanted")));
     QVERIFY(scene.stripes->timeLine()->isLive());
-    QVERIFY(scene.find<QPushButton>("liveButton")->isChecked());
+    QVERIFY(scene.find<QPushButton>("timeLineLiveButton")->isChecked());
     QCOMPARE(scene.track()->moment(), scene.track()->end());
     // A second one tells again and does not uncheck the button.
-    pointer.click(scene.middleOf(scene.find<QPushButton>("liveButton")));
+    pointer.click(scene.middleOf(scene.find<QPushButton>("timeLineLiveButton")));
     QCOMPARE(recorder.names().size(), 2);
-    QVERIFY(scene.find<QPushButton>("liveButton")->isChecked());
+    QVERIFY(scene.find<QPushButton>("timeLineLiveButton")->isChecked());
 }
 
 void TestRecordStripes::theFlagsKeepTheirOrder()
@@ -858,7 +858,7 @@ void TestRecordStripes::theStripesMayGoInASlotOfTheirs()
             break;
         case 1:
             QObject::connect(scene.stripes, &RecordStripes::liveWanted, &scene.session, end);
-            point = scene.middleOf(scene.find<QPushButton>("liveButton"));
+            point = scene.middleOf(scene.find<QPushButton>("timeLineLiveButton"));
             break;
         case 2:
             QObject::connect(scene.track(), &TimeTrack::rangeChosen, &scene.session, end);
@@ -905,7 +905,7 @@ void TestRecordStripes::handlesDoNotLieOverTheCardOfAnExport()
 void TestRecordStripes::aNewLanguageComesAtOnce()
 {
     Scene scene;
-    QCOMPARE(scene.find<QPushButton>("liveButton")->text(), QStringLiteral("Live"));
+    QCOMPARE(scene.find<QPushButton>("timeLineLiveButton")->text(), QStringLiteral("Live"));
     QStringList texts;
     Marking marking;
     whenOpen(scene, [&] {
@@ -917,11 +917,11 @@ void TestRecordStripes::aNewLanguageComesAtOnce()
     });
     scene.stripes->runExport(scene.bar);
     QCOMPARE(texts, QStringList(QStringLiteral("#Export")));
-    QCOMPARE(scene.find<QPushButton>("liveButton")->text(), QStringLiteral("#Live"));
+    QCOMPARE(scene.find<QPushButton>("timeLineLiveButton")->text(), QStringLiteral("#Live"));
     QCOMPARE(scene.find<QPushButton>("exportRunCancel")->text(), QStringLiteral("#Cancel"));
     QCoreApplication::removeTranslator(&marking);
     QCoreApplication::processEvents();
-    QCOMPARE(scene.find<QPushButton>("liveButton")->text(), QStringLiteral("Live"));
+    QCOMPARE(scene.find<QPushButton>("timeLineLiveButton")->text(), QStringLiteral("Live"));
     QCOMPARE(scene.find<QPushButton>("exportRunCancel")->text(), QStringLiteral("Cancel"));
     scene.session.logOut();
 }
