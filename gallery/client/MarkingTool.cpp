@@ -71,6 +71,9 @@ void MarkingTool::dropBand()
 {
     if (m_band) {
         m_band->disconnect(this);
+        if (m_draws) {
+            m_band->releaseMouse();
+        }
         m_band->hide();
         m_band->setCoordinateSystem(nullptr);
         m_band->deleteLater(); // it may be in its own signal
