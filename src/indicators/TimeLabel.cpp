@@ -12,6 +12,7 @@
 #include <QtGui/QFontMetrics>
 #include <QtGui/QMouseEvent>
 #include <QtWidgets/QLabel>
+#include <QtWidgets/QLineEdit>
 #include <QtWidgets/QStyle>
 
 namespace vx
@@ -121,17 +122,20 @@ void TimeLabel::setAnchortime(qulonglong time)
         return;
     }
     m_anchorTime = time;
+    forgetShown();
     refresh(true);
 }
 
 void TimeLabel::setErrorText(const QString& text)
 {
     m_errorText = text;
+    forgetShown();
     refresh(true);
 }
 
 void TimeLabel::resizeContent(bool reposition)
 {
+    forgetShown();
     refresh(reposition);
 }
 
@@ -173,8 +177,43 @@ void TimeLabel::refresh(bool reposition)
 void TimeLabel::calcTimeDiffs()
 {
     const QString text = m_errorText.isEmpty() ? frameTimeDifference(m_frameTime, m_anchorTime) : m_errorText;
-    m_dateTimeEdit->setDateTime(frameDateTime(m_frameTime));
+    const quint32 second = static_cast<quint32>(m_frameTime / 1000000);
+    if (!showsSecond(second)) {
+        showSecond(second);
+    }
     m_timeDiffLabel->setText(text);
+}
+
+bool TimeLabel::showsSecond(quint32 second) const
+{
+    return m_shownSecond == second && !m_dateTimeEdit->lineEdit()->isModified()
+        && m_dateTimeEdit->text() == m_shownText && m_dateTimeEdit->dateTime() == m_shownTime;
+}
+
+void TimeLabel::showSecond(quint32 second)
+{
+    const QDateTime time = frameDateTime(m_frameTime);
+    m_dateTimeEdit->setDateTime(time);
+    m_shownTime = m_dateTimeEdit->dateTime();
+    m_shownText = m_dateTimeEdit->text();
+    // Out of the range of the edit: tried anew each time.
+    m_shownSecond = m_shownTime == time ? qint64(second) : -1;
+}
+
+void TimeLabel::forgetShown()
+{
+    m_shownSecond = -1;
+    m_measuredWidths[0] = m_measuredWidths[1] = -1;
+}
+
+int TimeLabel::textWidth(const QFont& font, const QString& text, int part)
+{
+    if (m_measuredWidths[part] < 0 || text != m_measuredTexts[part] || font != m_measuredFonts[part]) {
+        m_measuredTexts[part] = text;
+        m_measuredFonts[part] = font;
+        m_measuredWidths[part] = QFontMetrics(font).horizontalAdvance(text);
+    }
+    return m_measuredWidths[part];
 }
 
 void TimeLabel::calcSizes()
@@ -221,12 +260,11 @@ void TimeLabel::arrangeWidgets()
 {
     const int symbolWidth = timeLabelSymbolWidth(m_lineHeight);
     m_symbolLabel->setGeometry(0, 0, symbolWidth, m_lineHeight);
-    const QFontMetrics metrics(m_dateTimeEdit->getFont());
-    const int editWidth
-        = m_dateTimeEdit->isVisible() ? metrics.horizontalAdvance(m_dateTimeEdit->text()) + 5 : 0;
+    const QFont font = m_dateTimeEdit->getFont();
+    const int editWidth = m_dateTimeEdit->isVisible() ? textWidth(font, m_dateTimeEdit->text(), 0) + 5 : 0;
     m_dateTimeEdit->setGeometry(symbolWidth, 0, editWidth, m_lineHeight);
     const QString difference = m_timeDiffLabel->text();
-    const int differenceWidth = difference.isEmpty() ? 0 : metrics.horizontalAdvance(difference) + 5;
+    const int differenceWidth = difference.isEmpty() ? 0 : textWidth(font, difference, 1) + 5;
     m_timeDiffLabel->setGeometry(symbolWidth + editWidth, 0, differenceWidth, m_lineHeight);
     setFixedSize(symbolWidth + editWidth + differenceWidth, m_lineHeight);
 }
@@ -327,6 +365,7 @@ void TimeLabel::mouseReleaseEvent(QMouseEvent* event)
 void TimeLabel::showEvent(QShowEvent* event)
 {
     QWidget::showEvent(event);
+    forgetShown();
     refresh(true);
 }
 

@@ -86,6 +86,10 @@ private Q_SLOTS:
 private:
     void refresh(bool reposition);
     void calcTimeDiffs();
+    bool showsSecond(quint32 second) const;
+    void showSecond(quint32 second);
+    void forgetShown();
+    int textWidth(const QFont& font, const QString& text, int part);
     void calcSizes();
     void arrangeWidgets();
     void nameSymbol(const QString& name);
@@ -112,6 +116,15 @@ private:
     int m_sizedWidth = -1;
     int m_sizedMaxHeight = -1;
     QFont m_sizedFont;
+    // What the edit shows if nobody else has touched it: a frame of the same second leaves it alone, since setting its
+    // time repaints it even if nothing changes.
+    qint64 m_shownSecond = -1;
+    QDateTime m_shownTime;
+    QString m_shownText;
+    // The widths of the texts of edit and difference.
+    QFont m_measuredFonts[2];
+    QString m_measuredTexts[2];
+    int m_measuredWidths[2] = {-1, -1};
     DateTimeEdit** m_rescuedEdit = nullptr; // where the destructor leaves the edit that is in its own signal
 };
 }

@@ -10,6 +10,7 @@
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QLabel>
+#include <QtWidgets/QLineEdit>
 
 #include <limits>
 
@@ -267,6 +268,76 @@ private Q_SLOTS:
         QCOMPARE(overlay.difference()->font().pointSize(), size);
         overlay.label->showFrametime(true, noon + 160000, 20, 5, true, Qt::AlignLeft, false);
         QVERIFY(overlay.difference()->font().pointSize() < size);
+    }
+
+    void aFrameOfTheSameSecondPaintsNothing()
+    {
+        struct Paints : QObject
+        {
+            int count = 0;
+            bool eventFilter(QObject*, QEvent* event) override
+            {
+                count += event->type() == QEvent::Paint ? 1 : 0;
+                return false;
+            }
+        } paints;
+        Overlay overlay;
+        overlay.show();
+        overlay.label->resizeContent(false);
+        overlay.edit()->installEventFilter(&paints);
+        overlay.difference()->installEventFilter(&paints);
+        overlay.label->installEventFilter(&paints);
+        QVERIFY(QTest::qWaitForWindowExposed(&overlay.window));
+        overlay.window.repaint();
+        QCoreApplication::processEvents();
+        paints.count = 0;
+        zelkovtest::SignalRecorder recorder(overlay.label);
+        for (quint64 frame = 1; frame < 25; ++frame) {
+            overlay.label->setFrametime(noon + frame * 40000);
+            QCoreApplication::processEvents();
+        }
+        QCOMPARE(paints.count, 0);
+        QCOMPARE(recorder.count(QStringLiteral("reposTimeLabel")), 24);
+        overlay.label->setFrametime(noon + second);
+        QTRY_VERIFY(paints.count > 0);
+        QCOMPARE(overlay.edit()->dateTime().toSecsSinceEpoch(), qint64(noon / second) + 1);
+    }
+
+    void aFrameOfTheSameSecondReplacesWhatTheUserTypes()
+    {
+        Overlay overlay;
+        overlay.show(noon, false, false);
+        overlay.label->setFrametime(noon + 40000);
+        const QString shown = overlay.edit()->text();
+        overlay.edit()->lineEdit()->setCursorPosition(shown.size());
+        QTest::keyClick(overlay.edit(), Qt::Key_Backspace);
+        QVERIFY(overlay.edit()->text() != shown);
+        overlay.label->setFrametime(noon + 80000);
+        QCOMPARE(overlay.edit()->text(), shown);
+        QSignalSpy changed(overlay.edit(), &QDateTimeEdit::dateTimeChanged);
+        overlay.edit()->setDateTime(QDateTime::fromSecsSinceEpoch(qint64(noon / second) + 5));
+        overlay.label->setFrametime(noon + 120000);
+        QCOMPARE(overlay.edit()->text(), shown);
+        QCOMPARE(changed.count(), 2);
+        overlay.edit()->clear();
+        overlay.label->setFrametime(noon + 160000);
+        QCOMPARE(overlay.edit()->text(), shown);
+        overlay.edit()->setDisplayFormat(QStringLiteral("hh:mm:ss"));
+        overlay.label->setFrametime(noon + 200000);
+        QCOMPARE(overlay.edit()->text(), QStringLiteral("12:00:00"));
+        QVERIFY(overlay.edit()->width() < QFontMetrics(overlay.edit()->getFont()).horizontalAdvance(shown));
+    }
+
+    void aTimeThatTheEditRefusesIsTriedAnew()
+    {
+        Overlay overlay;
+        overlay.show();
+        overlay.edit()->setMaximumDateTime(QDateTime::fromSecsSinceEpoch(qint64(noon / second) + 10));
+        overlay.label->setFrametime(noon + 60 * second);
+        QCOMPARE(overlay.edit()->dateTime().toSecsSinceEpoch(), qint64(noon / second) + 10);
+        overlay.edit()->clearMaximumDateTime();
+        overlay.label->setFrametime(noon + 60 * second + 1);
+        QCOMPARE(overlay.edit()->dateTime().toSecsSinceEpoch(), qint64(noon / second) + 60);
     }
 
     void anUnreadableLineIsGone()
