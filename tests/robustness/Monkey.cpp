@@ -230,7 +230,10 @@ private:
         if (type == QMetaType::QSize) {
             return value.toSize().boundedTo(QSize(100, 100));
         }
-        // Nor places from where Qt itself cannot count to the far corner of a rectangle.
+        // Nor numbers that, as a margin or a place, take a rectangle to where Qt itself cannot count to its far corner.
+        if (type == QMetaType::Int) {
+            return qBound(-100000, value.toInt(), 100000);
+        }
         if (type == QMetaType::QPoint) {
             return near(value.toPoint());
         }
