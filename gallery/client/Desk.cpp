@@ -188,6 +188,7 @@ void Desk::connectPanels()
         chooseCamera(id);
     });
     connect(m_stripes, &RecordStripes::timeChosen, this, &Desk::showRecorded);
+    connect(m_stripes, &RecordStripes::cameraChosen, this, &Desk::chooseCamera);
     connect(m_stripes, &RecordStripes::liveWanted, this, &Desk::showLive);
     connect(m_stripes, &RecordStripes::exportFinished, this, [this](bool complete) {
         tell(complete ? tr("The export is complete.") : tr("The export was stopped."));
@@ -344,6 +345,7 @@ void Desk::chooseCamera(int id)
 void Desk::showRecorded(quint64 microseconds)
 {
     m_wall->showRecorded(microseconds);
+    m_stripes->showTime(microseconds);
     m_bar->setLive(false);
     tell(tr("Recording of %1")
              .arg(QDateTime::fromMSecsSinceEpoch(qint64(microseconds / 1000)).toString(QStringLiteral("dd.MM.yyyy  hh:mm:ss"))));
@@ -352,6 +354,7 @@ void Desk::showRecorded(quint64 microseconds)
 void Desk::showLive()
 {
     m_wall->showLive();
+    m_stripes->showLive();
     m_bar->setLive(true);
     showCamera();
 }
@@ -371,6 +374,7 @@ void Desk::dropOrRestore()
 void Desk::showCamera()
 {
     const Camera* camera = m_fleet.camera(m_wall->currentCamera());
+    m_stripes->setCurrentCamera(m_wall->currentCamera());
     m_bar->setCameraOnline(!camera || camera->online);
     if (camera) {
         tell(tr("%1, %2, %3").arg(camera->name, camera->address, camera->online ? tr("online") : tr("offline")));

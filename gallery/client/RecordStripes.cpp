@@ -235,7 +235,7 @@ void RecordStripes::runExport(QWidget* target)
     connect(m_timeLine, &RecordTimeLine::rangeChosen, m_popover, &ExportPopover::setRange);
     const QPointer<RecordStripes> alive(this);
     const QPointer<ExportPopover> popover = m_popover;
-    const bool accepted = popover->ask(target ? target : m_area, suggested);
+    const bool accepted = popover->ask(target && target->isVisible() ? target : m_area, suggested);
     if (!alive) {
         return;
     }

@@ -59,7 +59,7 @@ RecordTimeLine::RecordTimeLine(Fleet& fleet, QWidget* parent)
     auto* row = new QHBoxLayout(m_words);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(10);
-    row->addWidget(m_moment, 1);
+    row->addWidget(m_moment);
     row->addWidget(m_range, 1);
     row->addWidget(m_export);
     row->addWidget(m_liveButton);
@@ -149,9 +149,28 @@ void RecordTimeLine::showWords()
     const auto clock = [](qint64 time) {
         return QDateTime::fromMSecsSinceEpoch(time).time().toString(QStringLiteral("HH:mm:ss"));
     };
-    m_range->setText(tr("Export %1 to %2 (%3)")
-                         .arg(clock(from), clock(to), TimeUtils::formatTimeUserFriendly((to - from + 500) / 1000)));
+    const QString length = TimeUtils::formatTimeUserFriendly((to - from + 500) / 1000);
+    m_rangeTexts = QStringList{tr("Export %1 to %2 (%3)").arg(clock(from), clock(to), length),
+        QStringLiteral("%1 \u2013 %2").arg(clock(from), clock(to)), length};
+    fitWords();
     m_range->setToolTip(tr("Drag the flags to choose what is exported."));
+}
+
+// The moment comes first; the range says as much as there is room for.
+void RecordTimeLine::fitWords()
+{
+    const int spacing = m_words->layout()->spacing();
+    int room = m_words->width() - m_export->sizeHint().width() - m_liveButton->sizeHint().width() - 3 * spacing;
+    m_moment->setMinimumWidth(qMax(0, qMin(room, m_moment->sizeHint().width())));
+    room -= m_moment->minimumWidth();
+    QString shown;
+    for (const QString& text : qAsConst(m_rangeTexts)) {
+        if (m_range->fontMetrics().horizontalAdvance(text) + 4 <= room) {
+            shown = text;
+            break;
+        }
+    }
+    m_range->setText(shown);
 }
 
 void RecordTimeLine::retranslate()
@@ -199,6 +218,7 @@ void RecordTimeLine::resizeEvent(QResizeEvent*)
     // By hand, so that the stripe does not squeeze it while it slides.
     m_words->setGeometry(s_margin, s_wordsTop, qMax(0, width() - 2 * s_margin), s_wordsHeight);
     m_track->setGeometry(0, s_trackTop, width(), TimeTrack::s_height);
+    fitWords();
 }
 
 void RecordTimeLine::showEvent(QShowEvent* event)
@@ -211,6 +231,9 @@ void RecordTimeLine::showEvent(QShowEvent* event)
 void RecordTimeLine::hideEvent(QHideEvent* event)
 {
     m_timer.stop();
+    if (m_popover) {
+        m_popover->dismiss(false, true); // it points at a handle that is going
+    }
     QWidget::hideEvent(event);
 }
 

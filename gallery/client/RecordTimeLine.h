@@ -3,6 +3,7 @@
 #pragma once
 
 #include <QtCore/QPointer>
+#include <QtCore/QStringList>
 #include <QtCore/QTimer>
 #include <QtWidgets/QLabel>
 #include <QtWidgets/QPushButton>
@@ -62,6 +63,7 @@ private:
     void choose(qint64 moment);
     void retranslate();
     void showWords();
+    void fitWords();
 
     Fleet& m_fleet;
     QWidget* m_words;
@@ -71,6 +73,7 @@ private:
     QPushButton* m_liveButton;
     TimeTrack* m_track;
     QPointer<vx::PopoverWidget::Controller> m_popover;
+    QStringList m_rangeTexts; // from long to short
     QTimer m_timer;
     bool m_live = true;
     bool m_exportAllowed = true;

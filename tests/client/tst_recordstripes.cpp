@@ -35,6 +35,7 @@
 #include "support/SignalRecorder.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "theme/Theme.h"
 #include "views/FadeStripeView.h"
 
 using client::Fleet;
@@ -225,6 +226,12 @@ private Q_SLOTS:
     void handlesDoNotLieOverTheCardOfAnExport();
 
     // Run time
+    void theQualityIsDragged();
+    void theMomentPopoverGoesWithTheStripes();
+    void aNarrowAreaKeepsTheMomentReadable();
+    void picturesBelowDoNotRepaintThePanels_data();
+    void picturesBelowDoNotRepaintThePanels();
+    void aNewThemeComesAtOnce();
     void aNewLanguageComesAtOnce();
 };
 
@@ -900,6 +907,147 @@ void TestRecordStripes::handlesDoNotLieOverTheCardOfAnExport()
     scene.window->resize(700, 700);
     QTRY_COMPARE(scene.seenHandles(), 3);
     scene.session.logOut();
+}
+
+void TestRecordStripes::theQualityIsDragged()
+{
+    Scene scene;
+    QString before;
+    QString after;
+    whenOpen(scene, [&] {
+        auto* const row = static_cast<vx::PopoverWidget::Item*>(scene.row("exportQuality"));
+        before = row->additionalText();
+        auto* const slider = row->findChild<vx::MultiNubsieSlider*>();
+        const QPoint start = scene.middleOf(slider);
+        Pointer pointer(scene.window.get());
+        pointer.move(start);
+        pointer.press();
+        pointer.move(start - QPoint(30, 0));
+        pointer.move(start - QPoint(40, 0));
+        pointer.release();
+        after = row->additionalText();
+        scene.popover()->dismiss(false, true);
+    });
+    scene.stripes->runExport(scene.bar);
+    QCOMPARE(before, QStringLiteral("80 %"));
+    QVERIFY(after != before && after.endsWith(QStringLiteral(" %")));
+    // Its handle does not stay behind in the window.
+    QTRY_COMPARE(scene.window->findChildren<vx::Nubsie*>().size(), 3);
+}
+
+void TestRecordStripes::theMomentPopoverGoesWithTheStripes()
+{
+    Scene scene;
+    QTRY_COMPARE(scene.seenHandles(), 3);
+    scene.stripes->timeLine()->askForMoment();
+    QPointer<Controller> popover = scene.find<Controller>("momentPopover");
+    QVERIFY(popover && popover->isVisible());
+    scene.stripes->timeLine()->askForMoment(); // one is enough
+    QCOMPARE(scene.window->findChildren<Controller*>(QStringLiteral("momentPopover")).size(), 1);
+    scene.stripes->setStripesVisible(false);
+    QTRY_VERIFY(!popover || !popover->isVisible());
+    scene.stripes->setStripesVisible(true);
+    QTRY_VERIFY(!popover);
+    scene.stripes->timeLine()->askForMoment();
+    popover = scene.find<Controller>("momentPopover");
+    QVERIFY(popover);
+    delete scene.area.data();
+    QTRY_VERIFY(!popover);
+}
+
+void TestRecordStripes::aNarrowAreaKeepsTheMomentReadable()
+{
+    Scene scene;
+    auto* const moment = scene.find<QLabel>("momentLabel");
+    auto* const range = scene.find<QLabel>("rangeLabel");
+    scene.stripes->showTime(quint64(scene.track()->begin() + s_day / 2) * 1000);
+    QStringList ranges;
+    for (int width = 1000; width >= 340; width -= 60) {
+        scene.window->resize(width, 500);
+        QCoreApplication::processEvents();
+        QVERIFY2(moment->width() >= moment->fontMetrics().horizontalAdvance(moment->text())
+                || range->text().isEmpty(),
+            qPrintable(QString::number(width)));
+        QVERIFY(range->text().isEmpty() || range->width() >= range->fontMetrics().horizontalAdvance(range->text()));
+        QVERIFY(scene.stripes->timeLine()->rect().contains(scene.find<QPushButton>("timeLineLiveButton")->geometry()));
+        ranges << range->text();
+    }
+    for (int i = 1; i < ranges.size(); ++i) {
+        QVERIFY(ranges.at(i).size() <= ranges.at(i - 1).size());
+    }
+    ranges.removeDuplicates();
+    QVERIFY(ranges.size() >= 3);
+}
+
+void TestRecordStripes::picturesBelowDoNotRepaintThePanels_data()
+{
+    QTest::addColumn<bool>("themed");
+    QTest::newRow("plain") << false;
+    QTest::newRow("themed") << true;
+}
+
+// The pictures run at 25 frames a second: what lies over them must not be painted as often.
+void TestRecordStripes::picturesBelowDoNotRepaintThePanels()
+{
+    QFETCH(bool, themed);
+    if (themed) {
+        zelkov::theme::apply(*qApp, zelkov::theme::Name::Light);
+    }
+    {
+        Scene scene;
+        auto* const wall = new QWidget(scene.area);
+        wall->lower();
+        wall->setGeometry(scene.area->rect());
+        wall->show();
+        scene.stripes->eventStripe()->fadein();
+        QTRY_VERIFY_WITH_TIMEOUT(scene.stripes->eventStripe()->height() > 130, 5000);
+        QTest::qWait(300);
+        struct Counter : QObject
+        {
+            bool eventFilter(QObject*, QEvent* event) override
+            {
+                count += event->type() == QEvent::Paint ? 1 : 0;
+                return false;
+            }
+            int count = 0;
+        } panels, walls;
+        scene.track()->installEventFilter(&panels);
+        scene.stripes->eventStripe()->findChild<client::EventStripe*>()->installEventFilter(&panels);
+        wall->installEventFilter(&walls);
+        for (int i = 0; i < 20; ++i) {
+            wall->update();
+            QTest::qWait(10);
+        }
+        QVERIFY(walls.count >= 15);
+        QVERIFY2(panels.count <= 4, qPrintable(QString::number(panels.count)));
+    }
+    if (themed) {
+        zelkov::theme::apply(*qApp, zelkov::theme::Name::None);
+    }
+}
+
+void TestRecordStripes::aNewThemeComesAtOnce()
+{
+    {
+        Scene scene;
+        QTRY_COMPARE(scene.seenHandles(), 3);
+        vx::Nubsie* const handle = scene.track()->positionSlider()->getNubsies().constFirst();
+        QVector<QColor> knobs;
+        QVector<QColor> grounds;
+        for (const zelkov::theme::Name name : {zelkov::theme::Name::Light, zelkov::theme::Name::Dark}) {
+            zelkov::theme::apply(*qApp, name);
+            QCoreApplication::processEvents();
+            const QImage icon = handle->icon().toImage();
+            knobs << icon.pixelColor(icon.rect().center());
+            const QImage line = scene.stripes->timeLine()->grab().toImage();
+            grounds << line.pixelColor(3, line.height() - 3);
+            QCOMPARE(scene.seenHandles(), 3);
+        }
+        QVERIFY(knobs.at(0) != knobs.at(1));
+        QVERIFY(grounds.at(0).lightness() > 200);
+        QVERIFY(grounds.at(1).lightness() < 80);
+    }
+    zelkov::theme::apply(*qApp, zelkov::theme::Name::None);
 }
 
 void TestRecordStripes::aNewLanguageComesAtOnce()
