@@ -96,7 +96,9 @@ Desk::Desk(Fleet& fleet, Session& session, QWidget* parent)
     m_splitter->setStretchFactor(1, 1);
     m_splitter->setStretchFactor(2, 0);
     m_splitter->setSizes({210, 10000, 210});
-    m_devices->setMinimumWidth(150);
+    m_devices->setContentsMargins(10, 8, 4, 0);
+    m_thumbnails->setContentsMargins(4, 8, 4, 0);
+    m_devices->setMinimumWidth(170);
     m_middle->setMinimumWidth(320);
     m_ptz->setMinimumWidth(180);
     m_ptz->hide();

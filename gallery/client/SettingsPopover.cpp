@@ -129,9 +129,10 @@ rows::Container* SettingsPopover::addSubmenu(
     Container* container, const QString& text, const QString& value, const QString& objectName)
 {
     Container* const content = PopoverPlace::column(objectName + QStringLiteral("Rows"));
-    add(container,
-        new rows::Submenu(rows::Manager::instance()->getUniquePopoverID(), text, text, value, objectName, m_owner, content,
-            m_place.controller(), IdSubmenu, c_usual | rows::eifAdditionalText, nullptr));
+    auto* row = new rows::Submenu(rows::Manager::instance()->getUniquePopoverID(), text, text, value, objectName, m_owner,
+        content, m_place.controller(), IdSubmenu, c_usual | rows::eifAdditionalText, nullptr);
+    row->controller()->setObjectName(objectName + QStringLiteral("Popover"));
+    add(container, row);
     return content;
 }
 

@@ -76,8 +76,10 @@ void SettingsPopover::addLabels(Container* container)
     add(m_labels, badges);
     showTristate();
 
-    connect(all, &Item::itemPerformed, this, [this, names, times, badges](int, const QVariant& value) {
-        const bool on = value.toInt() == Qt::Checked;
+    // The row goes through three states; here it is a matter of all or nothing.
+    connect(all, &Item::itemPerformed, this, [this, names, times, badges] {
+        const Settings::Values& now = m_settings.values();
+        const bool on = !(now.names && now.times && now.badges);
         m_settings.set(&Settings::Values::names, on);
         m_settings.set(&Settings::Values::times, on);
         m_settings.set(&Settings::Values::badges, on);
@@ -103,7 +105,6 @@ void SettingsPopover::showTristate()
     const int count = int(values.names) + int(values.times) + int(values.badges);
     auto* all = m_labels ? qobject_cast<rows::TristateCheckItem*>(m_labels->getItem(IdAllLabels)) : nullptr;
     if (all) {
-        // A click goes through the states that there are: only the mixture has the middle one.
         all->setTristate(count == 1 || count == 2);
         all->setCheckState(count == 0 ? Qt::Unchecked : count == 3 ? Qt::Checked : Qt::PartiallyChecked);
     }
