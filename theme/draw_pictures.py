@@ -81,6 +81,19 @@ def disc(*glyph):
     return render(96, 96, [(circle(48, 48, 46), plain(12, 16, 22, 170))] + [(part, plain(255, 255, 255)) for part in glyph])
 
 
+def half(rows):
+    """Each pixel the mean of four; the alpha weighs the colours."""
+    result = []
+    for y in range(0, len(rows), 2):
+        row = []
+        for x in range(0, len(rows[0]), 2):
+            four = [rows[y + j][x + i] for j in (0, 1) for i in (0, 1)]
+            alpha = sum(p[3] for p in four)
+            row.append(tuple(sum(p[c] * p[3] for p in four) // max(1, alpha) for c in range(3)) + (alpha // 4,))
+        result.append(row)
+    return result
+
+
 def overlays():
     folder = os.path.join(HERE, "pictures", "overlays")
     signs = {"play": [polygon((38, 28), (70, 48), (38, 68))],
@@ -93,6 +106,8 @@ def overlays():
             (glyph[1], plain(255, 255, 255)), (circle(48, 52, 12), plain(12, 16, 22)),
             (circle(48, 52, 7), plain(255, 255, 255))])
         write(os.path.join(folder, "sign-%s.png" % name), RGBA, layers)
+        if name in ("online", "snapshot"):
+            write(os.path.join(folder, "sign-%s-small.png" % name), RGBA, half(layers))
     white = plain(255, 255, 255)
     # 94 wide and 108 high, as the time label has its symbol.
     write(os.path.join(folder, "from-camera.png"), RGBA, render(94, 108, [

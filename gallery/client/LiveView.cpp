@@ -2,6 +2,7 @@
 #include "LiveView.h"
 
 #include "Fleet.h"
+#include "ZelkovUtils/TimeUtils.h"
 #include "controls/DateTimeEdit.h"
 #include "indicators/BusyOverlayView.h"
 #include "indicators/IconOverlayView.h"
@@ -20,6 +21,8 @@ namespace
 {
 constexpr int s_inset = 6;
 constexpr int s_captionMargin = 6;
+constexpr int s_widthForDate = 120; // below, a line with date and time would be too small to read
+constexpr int s_signSize = 110;
 constexpr double s_frameWidth = 3;
 constexpr double s_overscan = 1.16; // how much higher than the picture the ground is, so that it can look up and down
 constexpr double s_farthest = 4;
@@ -276,20 +279,27 @@ void LiveView::setCurrent(bool current)
 
 void LiveView::setShowName(bool on)
 {
-    m_showName = on;
-    place();
+    if (on != m_showName) {
+        m_showName = on;
+        place();
+    }
 }
 
 void LiveView::setShowTime(bool on)
 {
-    m_showTime = on;
-    place();
+    if (on != m_showTime) {
+        m_showTime = on;
+        place();
+    }
 }
 
 void LiveView::setShowBadge(bool on)
 {
-    m_showBadge = on;
-    update();
+    if (on != m_showBadge) {
+        m_showBadge = on;
+        place();
+        update();
+    }
 }
 
 void LiveView::lookBy(const QPointF& parts)
@@ -319,8 +329,11 @@ void LiveView::showSign(const QString& name, const QString& text)
     if (!isVisible()) {
         return;
     }
-    // A sign with a text needs more room than a small view has.
-    if (text.isEmpty() || width() < 260 || height() < 180) {
+    // A sign that needs more room than there is would stay hidden.
+    const int room = qMin(width(), height());
+    if (room < s_signSize) {
+        vx::IconOverlayView::showIcon(this, name + QLatin1String("Small"), false);
+    } else if (text.isEmpty() || room < 2 * s_signSize) {
         vx::IconOverlayView::showIcon(this, name, false);
     } else {
         vx::IconOverlayView::showTextAndIcon(this, text, name, false);
@@ -343,6 +356,15 @@ void LiveView::place()
     m_caption->setGeometry(s_inset, s_inset, qMin(wanted, room), metrics.height() + 4);
     m_caption->setVisible(m_showName);
 
+    const bool hasDate = width() >= s_widthForDate;
+    if (hasDate != m_hasDate) {
+        m_hasDate = hasDate;
+        vx::DateTimeEdit* const edit = m_time->getDateTimeEit();
+        edit->setDisplayFormat(TimeUtils::getDateTimeFormat(hasDate, true));
+        // Without a date to show, Qt limits the edit to the day of its time.
+        edit->clearMinimumDateTime();
+        edit->clearMaximumDateTime();
+    }
     const bool hasTime = m_showTime && m_frame != 0;
     m_time->showFrametime(hasTime, m_frame, qBound(14, height() / 9, 22), s_inset, true,
         Qt::AlignHCenter | Qt::AlignBottom, false);

@@ -71,7 +71,7 @@ public:
     void settle();
     /// While a tool works in the view it has no gestures but the double click.
     void setGestures(bool on);
-    /// A sign for a moment: its picture comes from the style sheet by the name.
+    /// A sign for a moment: its picture comes from the style sheet by the name, with "Small" after it in a small view.
     void showSign(const QString& name, const QString& text = QString());
 
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -122,6 +122,7 @@ private:
     bool m_showTime = true;
     bool m_showName = true;
     bool m_hasGestures = true;
+    bool m_hasDate = true;
     QString m_name;
     vx::BadgeDrawer m_count;
     vx::NameTimeLabel* m_caption;

@@ -463,7 +463,7 @@
     <name>client::PtzPanel</name>
     <message>
         <source>Pan</source>
-        <translation>Schwenken</translation>
+        <translation>Drehen</translation>
     </message>
     <message>
         <source>Tilt</source>

@@ -463,11 +463,11 @@
     <name>client::PtzPanel</name>
     <message>
         <source>Pan</source>
-        <translation>Panoramique</translation>
+        <translation>Pivoter</translation>
     </message>
     <message>
         <source>Tilt</source>
-        <translation>Inclinaison</translation>
+        <translation>Incliner</translation>
     </message>
     <message>
         <source>Zoom</source>

@@ -97,6 +97,7 @@ private Q_SLOTS:
     void theKeyboardChoosesAndEnlarges();
     void aDragLooksAround();
     void aLongPressTakesASnapshot();
+    void aSmallViewShowsTheTimeWithoutTheDate();
     void theRecordedTimeGoesToAllViews();
     void livePicturesMoveAndRecordedOnesStandStill();
     void theSameMomentIsTheSamePicture();
@@ -389,6 +390,22 @@ void TestLiveWall::aLongPressTakesASnapshot()
     QVERIFY(host.wall.view(2)->findChild<vx::IconOverlayView*>());
     pointer.release();
     QTRY_VERIFY(!host.wall.view(2)->findChild<vx::IconOverlayView*>()); // it has gone by itself
+}
+
+void TestLiveWall::aSmallViewShowsTheTimeWithoutTheDate()
+{
+    WallHost host(QSize(800, 700));
+    host.wall.setViewCount(64);
+    host.wall.showRecorded(c_Moment);
+    QVERIFY(host.wall.view(9)->width() < 110);
+    QCOMPARE(host.time(9)->getDateTimeEit()->text(), QStringLiteral("22:13:20"));
+    QVERIFY(host.time(9)->height() > 0);
+    QVERIFY(host.wall.view(9)->rect().contains(host.time(9)->geometry()));
+    host.wall.showRecorded(c_Moment + 24 * 3600 * quint64(1000000));
+    QCOMPARE(host.time(9)->getDateTimeEit()->dateTime().date(), QDate(2023, 11, 15));
+    host.wall.setEnlarged(9);
+    QVERIFY(host.time(9)->getDateTimeEit()->text().startsWith(QLatin1String("15 Nov")));
+    QVERIFY(host.wall.view(9)->rect().contains(host.time(9)->geometry()));
 }
 
 void TestLiveWall::theRecordedTimeGoesToAllViews()
