@@ -21,6 +21,7 @@ namespace client
 namespace
 {
 const int s_bars = 2 * c_Bordersize;
+const int s_openShare = 3; // of the area's height for the time line, at most one part of so many
 }
 
 RecordStripes::RecordStripes(Fleet& fleet, Session& session, QWidget* area)
@@ -68,6 +69,8 @@ void RecordStripes::makeStripes()
     m_bottom->show();
 
     connect(m_bottom, &FadeView::geometryChanged, this, &RecordStripes::follow);
+    connect(m_bottom, &FadeView::fadingOut, this, &RecordStripes::reserve);
+    connect(m_bottom, &FadeView::fadingInFinished, this, &RecordStripes::reserve);
     connect(m_events, &EventStripe::eventClicked, this, &RecordStripes::chooseEvent);
     connect(m_timeLine, &RecordTimeLine::momentChosen, this,
         [this](qint64 moment) { Q_EMIT timeChosen(quint64(moment) * 1000); });
@@ -175,7 +178,23 @@ void RecordStripes::place()
     if (m_run) {
         m_run->place();
     }
+    reserve();
     follow();
+}
+
+// Once a movement, and not with each step of it: the pictures are laid out anew.
+void RecordStripes::reserve()
+{
+    if (!m_top || !m_bottom) {
+        return;
+    }
+    const int open = RecordTimeLine::s_height + s_bars;
+    const bool isOpen = m_bottom->isFadedIn() && open * s_openShare <= m_area->height();
+    const QMargins margins(0, m_top->isHidden() ? 0 : c_Bordersize, 0,
+        m_bottom->isHidden() ? 0 : isOpen ? open : c_Bordersize);
+    if (m_area->contentsMargins() != margins) {
+        m_area->setContentsMargins(margins);
+    }
 }
 
 void RecordStripes::follow()

@@ -20,6 +20,10 @@ class Session;
 
 /// Two stripe panels over an area: events above, the time line with the export flags below. They lie over the area and
 /// follow its size. The lower one is open at first.
+///
+/// The contents margins of the area are what the panels take away from it while they rest, so that a layout in it
+/// leaves that free: the strips, and the time line where there is room enough for it. What slides, and the events, lie
+/// over the pictures.
 class RecordStripes : public QObject
 {
     Q_OBJECT
@@ -64,6 +68,7 @@ private:
     void watchAncestors();
     void place();
     void follow();
+    void reserve();
     void followRights();
     void chooseEvent(int camera, qint64 time);
     void startRun(const QString& fileName);

@@ -207,6 +207,7 @@ private Q_SLOTS:
     void noBalloonStaysWithoutItsHandle();
     void handlesStayInThePanelWhileItSlides();
     void panelsFollowTheArea();
+    void picturesKeepClearOfWhatRests();
     void handlesFollowWhatIsAroundTheArea();
     void theUpperPanelTakesTheFullHeightAndBack();
     void aRemovedCameraTakesItsEventsAlong();
@@ -606,6 +607,38 @@ void TestRecordStripes::panelsFollowTheArea()
             QVERIFY(line.contains(handle->geometry()));
         }
     }
+}
+
+void TestRecordStripes::picturesKeepClearOfWhatRests()
+{
+    Scene scene;
+    auto* const pictures = new QWidget;
+    auto* const layout = new QVBoxLayout(scene.area);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(pictures);
+    pictures->lower();
+    FadeStripeView* const top = scene.stripes->eventStripe();
+    FadeStripeView* const bottom = scene.stripes->timeStripe();
+    const auto between = [&] {
+        return QRect(0, c_Bordersize, scene.area->width(), scene.area->height() - c_Bordersize - bottom->height());
+    };
+    QTRY_COMPARE(pictures->geometry(), between());
+    QCOMPARE(bottom->height(), client::RecordTimeLine::s_height + 2 * c_Bordersize);
+    scene.clickGrab(bottom);
+    QTRY_COMPARE_WITH_TIMEOUT(bottom->height(), c_Bordersize, 5000);
+    QTRY_COMPARE(pictures->geometry(), between());
+    scene.clickGrab(bottom);
+    QTRY_VERIFY_WITH_TIMEOUT(bottom->height() > 100, 5000);
+    QTRY_COMPARE(pictures->geometry(), between());
+    // The events lie over them.
+    top->fadein();
+    QTRY_VERIFY_WITH_TIMEOUT(top->height() > 100, 5000);
+    QCOMPARE(pictures->geometry(), between());
+    // Neither do both of them fit into a low area.
+    scene.window->resize(900, 400);
+    QTRY_COMPARE(pictures->geometry().bottom(), scene.area->height() - c_Bordersize - 1);
+    scene.stripes->setStripesVisible(false);
+    QTRY_COMPARE(pictures->geometry(), scene.area->rect());
 }
 
 void TestRecordStripes::handlesFollowWhatIsAroundTheArea()
