@@ -32,6 +32,7 @@ public:
         elNothing = 5  ///< as a threshold: no message at all; has no stream
     };
 
+    /// The one log of the process; what it has that is not static is its lock.
     static Log& instance();
 
     /// The stream of the level; null if it has none, and for values that are no level.
@@ -47,6 +48,7 @@ public:
     /// in "2026-03-01 12:30:05.250 FAULT ". It holds no square brackets.
     static void pre(ELevel level, std::wstring& line);
 
+    // The recursive lock, in the form that std::lock_guard and std::unique_lock take.
     void lock();
     void unlock();
     bool try_lock();

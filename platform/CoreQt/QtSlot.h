@@ -31,6 +31,7 @@ namespace vx
 class ZELKOV_COREQT_EXPORT QtSlot
 {
 public:
+    /// Parameters have the indexes 0 to 9.
     static constexpr int s_ParameterCount = 10;
 
     QtSlot();
@@ -40,9 +41,11 @@ public:
     QtSlot& operator=(const QtSlot& other);
     ~QtSlot();
 
+    /// Null without a receiver, and once it is gone.
     QObject* receiver() const;
     /// Never null. Valid as long as this object is neither changed nor destroyed; so is what parameter() gives.
     const char* slotName() const;
+    /// As given to the constructor.
     Qt::ConnectionType connectionType() const;
 
     /// The argument at \a index, empty if none was set and for an index outside 0 to 9.

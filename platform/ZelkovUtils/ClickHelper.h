@@ -36,6 +36,7 @@ public:
     ClickHelper(QWidget* parent, int features);
     ~ClickHelper() override;
 
+    /// What is reported, as given to the constructor.
     int features() const;
     QWidget* receiver() const;
     /// The widget to watch, null for none. Not owned. Forgets a press that has not been released yet.

@@ -30,8 +30,10 @@ public:
     CoordinateSystem() = default;
     virtual ~CoordinateSystem();
 
+    /// The pixels of a rectangle of the application.
     virtual QRect mapToScreen(const QRectF& rect) const = 0;
 
+    // Moves one edge of \a rect, a rectangle of the application, to a pixel. The opposite edge stays.
     virtual void setLeft(QRectF& rect, int screenX) const = 0;
     virtual void setTop(QRectF& rect, int screenY) const = 0;
     virtual void setRight(QRectF& rect, int screenX) const = 0;

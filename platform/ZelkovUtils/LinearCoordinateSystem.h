@@ -17,13 +17,16 @@ namespace vx
 class ZELKOV_UTILS_EXPORT LinearCoordinateSystem : public CoordinateSystem
 {
 public:
+    /// Normalises \a applicationRect. The widget may be null.
     LinearCoordinateSystem(const QRectF& applicationRect, QWidget* widget);
     ~LinearCoordinateSystem() override;
 
     QRectF applicationRect() const;
     /// Normalised when stored.
     void setApplicationRect(const QRectF& rect);
+    /// Null without one, and once it is gone.
     QWidget* widget() const;
+    /// Not owned; null for none.
     void setWidget(QWidget* widget);
 
     QRect mapToScreen(const QRectF& rect) const override;

@@ -15,6 +15,7 @@ class ZELKOV_WIDGETS_EXPORT AnimatedCheckBox : public iOSCheckBox
     Q_OBJECT
 
 public:
+    /// \a path names the picture, whose three frames lie side by side.
     explicit AnimatedCheckBox(QWidget* parent = nullptr, bool checked = false,
         QString path = QStringLiteral(":/icons/btn_schalter.png"));
     ~AnimatedCheckBox() override;

@@ -23,6 +23,7 @@ public:
     };
     Q_ENUM(EPosition)
 
+    /// Without a default; the button is hidden.
     explicit DateTimeDefaultEdit(QWidget* parent = nullptr, EPosition position = Right);
     ~DateTimeDefaultEdit() override;
 

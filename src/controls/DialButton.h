@@ -57,6 +57,7 @@ public:
     bool isCheckable() const; //!< default true
     void setCheckable(bool checkable);
 
+    /// What reset() and the rebound go to. Setting it moves nothing.
     int defaultValue() const;
     void setDefaultValue(int value);
     bool reboundEnabled() const; //!< default false
@@ -80,6 +81,8 @@ public:
     QPixmap handle() const;
     void setHandle(const QPixmap& handle); //!< orbits the knob at a quarter of its size; nothing without a knob
 
+    // Pixels between the edges and the background plate; 0 at first. Mirrored: the left edge is inset by the
+    // right margin.
     int rightMargin() const;
     void setRightMargin(int pixels);
     int leftMargin() const;
@@ -88,6 +91,7 @@ public:
     void setTopMargin(int pixels);
     int bottomMargin() const;
     void setBottomMargin(int pixels);
+    // Pixels between the plate and the knob; 0 at first. Mirrored as the margins are.
     int rightPadding() const;
     void setRightPadding(int pixels);
     int leftPadding() const;
@@ -122,13 +126,17 @@ public Q_SLOTS:
 Q_SIGNALS:
     /// For clients; this class does not emit it.
     void clicked(bool checked = false);
+    /// The user pressed the dial; comes after toggled(true).
     void pressed();
+    /// The user let the dial go; comes after toggled(false).
     void released();
+    /// The checked state was set, changed or not.
     void toggled(bool checked);
     /// The dial has returned to its default value, after released(). Not without a move.
     void reboundPerformed(int value);
 
 protected Q_SLOTS:
+    /// End of the timer of setMouseClickSensitivity(), which nothing starts.
     void onTimeout();
     /// Shows the value in the balloon.
     void updateBalloon(int value);

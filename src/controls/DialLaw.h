@@ -11,10 +11,10 @@ namespace vx
 /// Range and mapping of a dial.
 struct DialRange
 {
-    int minimum = 0;
-    int maximum = 99;
-    bool wrapping = false;
-    bool inverted = false;
+    int minimum = 0; ///< as QDial::minimum()
+    int maximum = 99; ///< as QDial::maximum()
+    bool wrapping = false; ///< the value goes round
+    bool inverted = false; ///< the user sees the maximum at the start
 };
 
 /// Angle of a value in radians, clockwise on the screen: (cos, sin) is the direction with y pointing down. Not

@@ -21,6 +21,7 @@ class ZELKOV_WIDGETS_EXPORT FilepathEdit : public QLineEdit
 
 public:
     explicit FilepathEdit(QWidget* parent = nullptr);
+    /// Starts with that path.
     explicit FilepathEdit(const QString& text, QWidget* parent = nullptr);
     ~FilepathEdit() override;
 

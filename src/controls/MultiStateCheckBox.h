@@ -15,6 +15,7 @@ class ZELKOV_WIDGETS_EXPORT MultiStateCheckBox : public TMultiStateWidget<QCheck
     Q_PROPERTY(int state READ state WRITE setState)
 
 public:
+    /// Starts with the first of \a states, or 0. The parent owns the button.
     MultiStateCheckBox(const QList<int>& states, const QString& objectName, QWidget* parent);
     ~MultiStateCheckBox() override;
 };

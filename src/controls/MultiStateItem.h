@@ -38,8 +38,8 @@ protected:
     /// Takes the step, if changes are enabled or \a force is true. Returns the state that then holds.
     int goToNextState(bool force);
 
-    QList<int> m_stateList;
-    int m_state = 0;
-    bool m_stateChangeEnabled = true;
+    QList<int> m_stateList; ///< in the order of the steps
+    int m_state = 0; ///< need not be in the list
+    bool m_stateChangeEnabled = true; ///< whether clicks take the step
 };
 }

@@ -15,6 +15,7 @@ class ZELKOV_WIDGETS_EXPORT MultiStatePushButton : public TMultiStateWidget<QPus
     Q_PROPERTY(int state READ state WRITE setState)
 
 public:
+    /// Starts with the first of \a states, or 0. The parent owns the button.
     MultiStatePushButton(const QList<int>& states, const QString& objectName, QWidget* parent);
     ~MultiStatePushButton() override;
 };

@@ -15,6 +15,7 @@ class ZELKOV_WIDGETS_EXPORT MultiStateToolButton : public TMultiStateWidget<QToo
     Q_PROPERTY(int state READ state WRITE setState)
 
 public:
+    /// Starts with the first of \a states, or 0. The parent owns the button.
     MultiStateToolButton(const QList<int>& states, const QString& objectName, QWidget* parent);
     ~MultiStateToolButton() override;
 };

@@ -25,7 +25,7 @@ public:
 
 protected:
     bool m_reserved = false; // keeps the place of what follows
-    bool m_forceNextState = false;
-    QWidget* m_widget;
+    bool m_forceNextState = false; ///< while setNextState() takes a forced step
+    QWidget* m_widget; ///< the button itself
 };
 }

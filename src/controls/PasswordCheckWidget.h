@@ -29,6 +29,7 @@ class ZELKOV_WIDGETS_EXPORT PasswordCheckWidget : public QWidget
     Q_PROPERTY(EPasswordsMatchState passwordsMatchDisplay READ passwordsMatchDisplay)
 
 public:
+    /// The verdict on the password.
     enum ESecureState : int
     {
         essNone = 0,
@@ -37,6 +38,7 @@ public:
     };
     Q_ENUM(ESecureState)
 
+    /// The verdict on the repetition.
     enum EPasswordsMatchState : int
     {
         epmNone = 0,
@@ -75,10 +77,12 @@ public:
     PasswordCheckWidget(bool oldPasswordSet, QFlags<ESecurityRequirement> requirements, QWidget* parent = nullptr);
     ~PasswordCheckWidget() override;
 
+    /// What is asked of the password from now on.
     virtual void setSecurityRequirements(QFlags<ESecurityRequirement> requirements);
 
     /// The requirements that are asked for and met.
     QFlags<ESecurityRequirement> evaluateSecurityRequirements() const;
+    /// Whether all that are asked for are met.
     bool allRequirementsMet() const;
     QFlags<ESecurityRequirement> securityRequirements() const;
     /// Pattern (QRegExp, case sensitive) for esrAllowedCharacters. Empty by default, which only an empty field meets;
@@ -92,8 +96,10 @@ public:
     bool isDirty() const;
     /// True when both fields hold text: the reverse of its name. Clients rely on it.
     bool isEmpty() const;
+    /// As given to the constructor.
     bool oldPasswordSet() const;
     int minimumPasswordLength() const; //!< always s_DefaultMinimumLength
+    // The fields, with the object names "firstInput" and "secondInput".
     QLineEdit* firstLineEdit() const;
     QLineEdit* secondLineEdit() const;
 
@@ -106,12 +112,17 @@ protected:
     /// Whether the password has been used before: for subclasses. False here.
     virtual bool passwordInHistory(const QString& password) const;
 
+    /// Builds the form; called by the constructors.
     void init(QWidget* firstLabel, QWidget* secondLabel, Orientation orientation, bool oldPasswordSet,
         QFlags<ESecurityRequirement> requirements);
+    /// Dresses a field and lays it out beside or below its label.
     void initializeLineEdit(QBoxLayout* layout, QLineEdit* edit, QWidget* label, Orientation orientation,
         const QString& placeholder, const QString& objectName, bool oldPasswordSet);
+    /// Sets both states anew; "none" unless isDirty().
     void updateSecurityState();
+    /// Lets the style polish both fields anew, so that the rules for the states take hold.
     void resetStyleSheet();
+    // Whether the user has edited the first field, and the second.
     void setDirtyFirst(bool dirty);
     void setDirtySecond(bool dirty);
 

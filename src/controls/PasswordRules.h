@@ -8,7 +8,9 @@
 
 namespace vx
 {
+/// A small and a capital letter, a to z.
 ZELKOV_WIDGETS_EXPORT bool hasUpperAndLowerCase(const QString& password);
+/// A digit and a letter, a to z in either case.
 ZELKOV_WIDGETS_EXPORT bool hasDigitAndLetter(const QString& password);
 /// An underscore or anything that is no word character.
 ZELKOV_WIDGETS_EXPORT bool hasSpecialCharacter(const QString& password);

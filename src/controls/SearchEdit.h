@@ -22,6 +22,7 @@ class ZELKOV_WIDGETS_EXPORT SearchEdit : public QLineEdit
 
 public:
     explicit SearchEdit(QWidget* parent = nullptr);
+    /// Starts with that text.
     explicit SearchEdit(const QString& text, QWidget* parent = nullptr);
     ~SearchEdit() override;
 

@@ -16,6 +16,7 @@ template <typename T>
 class TMultiStateCustomWidget : public TCustomClickWidget<T>, public MultiStateWidget
 {
 public:
+    /// Starts with the first of \a states, or 0; changes are enabled.
     TMultiStateCustomWidget(const QList<int>& states, const QString& objectName, QWidget* parent);
     ~TMultiStateCustomWidget() override;
 

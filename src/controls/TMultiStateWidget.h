@@ -17,6 +17,7 @@ template <typename T>
 class TMultiStateWidget : public TFadingWidget<T>, public MultiStateWidget
 {
 public:
+    /// Starts with the first of \a states, or 0; changes are enabled.
     TMultiStateWidget(const QList<int>& states, const QString& objectName, QWidget* parent);
     ~TMultiStateWidget() override;
 

@@ -36,6 +36,7 @@ public:
     int id() const; //!< 0 where the field holds no number
     void setId(int id);
 
+    /// The name of the corridor, as the field has it.
     QString lineName();
     void setLineName(const QString& name);
     QString rightName(); //!< title of the side called "East" at first

@@ -43,6 +43,7 @@ public:
 
     /// Whether changes of the state slide the strip. Off by default; a click leaves it off.
     bool getAnimationModeOn() const;
+    /// See getAnimationModeOn().
     void setAnimationMode(bool on);
 
 public Q_SLOTS:
@@ -54,6 +55,7 @@ protected:
     const QPixmap* controlMacCheckBox() const;
     /// Milliseconds for a whole crossing; 300 at first.
     int* controlIconAnimationDuration();
+    /// Where the strip stands.
     QPointF* controlIconPosition();
 
     /// The strip in that size, kept until another size is asked for. Null without a picture.

@@ -27,11 +27,13 @@ public:
     /// The last holder deletes the row.
     using TListWidgetItemPointer = QSharedPointer<QListWidgetItem>;
 
+    /// An empty list outside of edit mode.
     explicit iOSListWidget(QWidget* parent = nullptr, const QString& objectName = QString());
     ~iOSListWidget() override;
 
     /// Default off. Leaving it ends the delete mode of all rows at once.
     void setEditMode(bool on);
+    /// Turns the edit mode over.
     void toggleEditMode();
     bool editMode() const;
     /// Turns the delete mode of this row over and ends that of all others: at most one row has it. Emits
@@ -50,10 +52,13 @@ public:
     QSize sizeHint() const override;
 
 public Q_SLOTS:
+    /// Deletes all rows, without itemRemoved(), and makes the list 0 pixels high.
     void clear();
     /// Takes the row out and hands it over by itemRemoved(). Null and a row of no or another list are ignored.
     void deleteItem(QListWidgetItem* item);
+    /// Makes the labels of selected rows bold, unless setBoldSelectionIndication() turned that off.
     void itemSelectionChanged();
+    /// The size hint has changed: lays out anew and emits layoutChanged() if the list is visible.
     void layoutUpdated();
 
 Q_SIGNALS:
@@ -64,11 +69,13 @@ Q_SIGNALS:
     void dataMoved(QVariant fromData, QVariant toData);
     /// The row is out of the list. Its widgets are deleted with the next turn of the event loop.
     void itemRemoved(vx::iOSListWidget::TListWidgetItemPointer item);
+    /// A row was made and has joined the list.
     void itemAdded();
     /// Rows or their widgets have changed while the list is visible.
     void layoutChanged();
 
 protected:
+    /// Fills the list with the colour.
     void setBackgroundColor(const QColor& color);
 
     void dropEvent(QDropEvent* event) override;

@@ -44,6 +44,8 @@ public:
         QWidget* accessoryWidget = nullptr);
     ~iOSListWidgetItem() override;
 
+    /// Shows or hides delete sign and grip, puts the edit widget in the place of the content, and ends the
+    /// delete mode. The list calls it.
     virtual void setEditMode(bool on);
     /// Brings out the delete button in place of the grip.
     virtual void setDeleteMode(bool on, bool animated);
@@ -55,11 +57,13 @@ public:
     /// Whether the row can be dragged; the grip follows with the next change of the mode.
     void setMovable(bool movable);
 
+    // The widgets of the row; null for those that it was not given.
     QWidget* accessoryWidget() const;
     QWidget* editWidget() const;
     QWidget* itemWidget() const;
     /// Deletes the present one. Null leaves none.
     void setAccessoryWidget(QWidget* widget);
+    /// Puts another content in the place of the present one, which is deleted.
     void setItemWidget(QWidget* widget);
     void setEditWidgetEnabled(bool enabled);
     bool editWidgetEnabled() const; //!< false without an edit widget
@@ -67,6 +71,7 @@ public:
     /// What a drag outside of edit mode carries.
     void setMimeData(const QString& type, const QByteArray& data);
     QByteArray mimeData(const QString& type) const;
+    /// The formats set by setMimeData().
     QStringList mimeTypes() const;
 
     /// Shows or hides the widget for selected rows; nothing in edit mode. The selection itself is the list's.
@@ -75,10 +80,12 @@ public:
     /// Off suppresses the tool tip until it is turned on again or a drag over the row ends.
     void setToolTipEnabled(bool enabled);
     void setTooltipImageFilePath(const QString& path); //!< one picture; empty for none
+    /// Several pictures, which take turns every 2.5 seconds.
     void setTooltipImageFilePaths(const QStringList& paths);
 
     /// Animated.
     void toggleDeleteMode();
+    /// Whether the delete button is out.
     bool isInDeleteMode() const;
 
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -88,16 +95,22 @@ Q_SIGNALS:
     void itemToBeDeleted(QListWidgetItem* itemToBeDeleted);
 
 protected Q_SLOTS:
+    /// The delete button was released: emits itemToBeDeleted().
     void deleteItem();
+    /// The delete sign was clicked: asks the list for the delete mode.
     void enableDeleteMode();
+    // Start the tool tip anew, and end it, as the pointer goes over the row.
     void mouseMoved();
     void mouseLeft();
     void mouseEntered();
+    // Shows the first picture, and the next one; nothing without pictures.
     void showTooltip();
     void toggleTooltip();
+    /// Allows tool tips again.
     void dragEnded(QObject* target);
 
 protected:
+    /// Shows the picture at the pointer, 320 pixels wide.
     void showTooltipForFilePath(const QString& path) const;
 
 private:

@@ -76,20 +76,20 @@ protected:
     /// Looks up shape and place of the tint, once in the life of the widget.
     void preparePaint(QPaintEvent* event);
 
-    QPointer<QWidget> m_widget;
-    BadgeDrawer m_badge;
-    int m_interval;
+    QPointer<QWidget> m_widget; ///< the button itself
+    BadgeDrawer m_badge; ///< see badge()
+    int m_interval; ///< of the timer, in milliseconds
     int m_step;              ///< its sign is the present direction
     QColor m_color;          ///< its alpha is the running value
-    int m_minAlpha;
-    int m_maxAlpha;
+    int m_minAlpha; ///< where the pulse turns, 0 to 255
+    int m_maxAlpha; ///< where the pulse turns, 0 to 255
     bool m_once;             ///< stop at the next limit; never cleared
-    QTimer m_timer;
+    QTimer m_timer; ///< runs during a pulse
     QRect m_rect;            ///< where the shape stands, in the widget's coordinates
     QImage m_image;          ///< the shape, ARGB32 in either form
     QVector<QImage> m_tinted; ///< by alpha level: steps above the lower limit
-    QImage m_overlay;
-    QRect m_overlayRect;
+    QImage m_overlay; ///< see setOverlay(); null without one
+    QRect m_overlayRect; ///< in the widget's coordinates
 
 private:
     QImage loadFromStyleSheet() const;

@@ -25,11 +25,11 @@
 
 namespace vx
 {
-/// The two levels that this library uses. Numbers, since the names of the levels are the platform's.
+// The two levels that this library uses. Numbers, since the names of the levels are the platform's.
 constexpr int c_LogTrace = 1;
 constexpr int c_LogFault = 3;
 
-/// What stands around the function's name.
+// What stands around the function's name.
 ZELKOV_WIDGETS_EXPORT extern const wchar_t s_LogFunctionOpen[];
 ZELKOV_WIDGETS_EXPORT extern const wchar_t s_LogFunctionClose[];
 

@@ -34,6 +34,7 @@ public:
     static const int s_FadeInTime;  ///< 1000 ms
     static const int s_FadeOutTime; ///< 350 ms
 
+    /// Fades \a widget, which owns the animation; its graphics effect is taken away.
     explicit OpacityAnimation(QWidget* widget);
 
     /// The same as with the widget alone: \a target and \a property are replaced by the opacity.

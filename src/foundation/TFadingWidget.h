@@ -30,6 +30,7 @@ public:
     /// effect, whatever it is.
     void enableShadow(bool on);
 
+    /// As FadingWidget::stopFading(), for the button by its own type.
     void stopFading();
 
 protected:

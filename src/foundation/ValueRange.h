@@ -18,16 +18,18 @@ struct ValueRange
         , second(value)
     {
     }
+    /// Both ends belong to it. Empty if \a to is below \a from.
     constexpr ValueRange(int from, int to)
         : first(from)
         , second(to)
     {
     }
 
+    /// Both ends count.
     constexpr bool contains(int value) const { return first <= value && value <= second; }
 
-    int first = 0;
-    int second = 0;
+    int first = 0; ///< lower end
+    int second = 0; ///< upper end, included
 };
 
 constexpr bool operator<(const ValueRange& a, const ValueRange& b)

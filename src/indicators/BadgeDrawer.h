@@ -84,6 +84,7 @@ public:
 
     //! True while there is a pixmap, be it transparent.
     bool hasBadge() const;
+    /// What drawBadge() draws; null without a badge.
     QPixmap currentPixmap() const;
 
     //! The pixmap's size, or badgeSize() while there is none.

@@ -35,8 +35,8 @@ constexpr int TickInterval = 50; //!< milliseconds between two ticks: 12 ticks a
 //! How many start angles there are: three of the first turn and the twelve that recur.
 constexpr int AngleCount = (FirstAngle + FullTurn) / AngleStep;
 
-constexpr int DotCount = 8;
-constexpr int SpokeCount = 12;
+constexpr int DotCount = 8; ///< of the busy mark of dots
+constexpr int SpokeCount = 12; ///< of the busy mark of spokes
 
 // Busy mark ------------------------------------------------------------------------------------------------
 

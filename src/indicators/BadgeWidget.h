@@ -40,6 +40,7 @@ public:
 
     int busyBadgeType() const; //!< BadgeDrawer::EBusyBadgeType as a number; unknown ones show nothing
     void setBusyBadgeType(int type);
+    // As in BadgeDrawer, with the same defaults.
     QSize badgeSize() const;
     void setBadgeSize(const QSize& size);
     bool badgeStroke() const;
@@ -53,11 +54,13 @@ public:
     QColor badgeBackground() const;
     void setBadgeBackground(const QColor& color);
 
+    /// Starts or ends the busy mark, see BadgeDrawer::setBadgeBusy().
     void setBadgeBusy(bool on);
 
     //! Shows \a text, not struck through, with the size and the outline of the properties.
     void setBadgeLabel(const QString& text);
     QString badgeLabel() const;
+    /// Whether there is something to draw.
     bool hasBadge() const;
 
     //! The size of the badge on show, or badgeSize() while there is none.

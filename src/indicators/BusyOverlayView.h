@@ -35,6 +35,7 @@ public:
     /// Hides the overlay or gives up the waiting; the next round counts from 1 again.
     void hideBusyOverlay();
 
+    /// Shows the text line and fits the overlay.
     void showBusyText();
     void hideBusyText(); //!< the size stays as it is
 
@@ -45,6 +46,7 @@ public:
     /// shows with the next second.
     QString busyText() const;
     void setBusyText(const QString& text);
+    /// Back to the default text.
     void clearBusyText();
 
 Q_SIGNALS:

@@ -23,6 +23,7 @@ class ZELKOV_WIDGETS_EXPORT ElidedButton : public QPushButton
 
 public:
     explicit ElidedButton(QWidget* parent = nullptr);
+    /// Starts with that text, not elided.
     explicit ElidedButton(const QString& text, QWidget* parent = nullptr);
     ~ElidedButton() override;
 

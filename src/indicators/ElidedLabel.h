@@ -22,6 +22,7 @@ class ZELKOV_WIDGETS_EXPORT ElidedLabel : public QLabel
     Q_OBJECT
 
 public:
+    // As the constructors of QLabel.
     explicit ElidedLabel(QWidget* parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());
     explicit ElidedLabel(
         const QString& text, QWidget* parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());

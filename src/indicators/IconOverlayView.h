@@ -23,6 +23,7 @@ class ZELKOV_WIDGETS_EXPORT IconOverlayView : public QWidget
     Q_OBJECT
 
 public:
+    /// What is animated while a sign comes and goes.
     enum EAnimationType : int
     {
         eatGeometry = 0, ///< the content grows from the centre

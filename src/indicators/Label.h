@@ -19,6 +19,7 @@ class ZELKOV_WIDGETS_EXPORT Label : public QLabel
     Q_OBJECT
 
 public:
+    // As the constructors of QLabel.
     explicit Label(QWidget* parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());
     explicit Label(const QString& text, QWidget* parent = nullptr, Qt::WindowFlags flags = Qt::WindowFlags());
     ~Label() override;

@@ -26,6 +26,7 @@ public:
     explicit NameTimeLabel(QWidget* parent = nullptr);
     ~NameTimeLabel() override;
 
+    // The parts of the line; it is fitted anew at once.
     void setText(QString name, QString time, QString date);
     void setDeviceName(QString name);
     void setDate(QString date);
@@ -33,6 +34,7 @@ public:
     void setTime(QString time);
     /// The device's time, and date and time as texts in the given formats. Checks the clock after setting the text.
     void setDateTime(QDateTime dateTime, Qt::DateFormat dateFormat, Qt::DateFormat timeFormat);
+    /// The name as it was set, whether or not it is shown.
     QString getDeviceName();
     /// Default off. Turning it off ends the blinking.
     void setCheckTimeSync(bool on);

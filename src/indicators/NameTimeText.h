@@ -14,15 +14,15 @@ namespace vx
 /// them again but the owner.
 struct NameTimeText
 {
-    QString name;
-    QString date;
-    QString time;
-    bool showName = true;
-    bool showDate = true;
-    bool showTime = true;
+    QString name; ///< of the device
+    QString date; ///< as it is to be shown
+    QString time; ///< as it is to be shown
+    bool showName = true; ///< lowered where the name has no room
+    bool showDate = true; ///< lowered where the date has no room
+    bool showTime = true; ///< lowered where the time has no room
     /// Where not even name and time fit: the name, else time and date.
     bool nameInNarrowMode = true;
-    bool timeDropped = false;
+    bool timeDropped = false; ///< the time has no room beside the name
 };
 
 /// The text to show: name, date and time, each but the time followed by a blank. First the date goes, then the time.

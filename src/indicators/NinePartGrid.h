@@ -25,8 +25,8 @@ struct NinePart
 /// Grid lines are shared: neighbours overlap by one pixel and the later one lies on top.
 struct NinePartGrid
 {
-    std::array<NinePart, 9> parts;
-    int count = 0;
+    std::array<NinePart, 9> parts; ///< the first of them count
+    int count = 0; ///< 0 to 9
 };
 
 /// Margins as given at all four sides, whatever the size of the target.

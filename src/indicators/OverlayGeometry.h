@@ -14,14 +14,15 @@ namespace vx
 /// What becomes of a text line that is \a textWidth pixels wide at \a pointSize points.
 struct BusyTextFit
 {
+    /// The three outcomes.
     enum EFit : int
     {
         Fits,   ///< at the base size, which is also the largest
         Shrink, ///< to pointSize points
         TooLong ///< it would need 8 points or less
     };
-    EFit fit;
-    double pointSize;
+    EFit fit; ///< what becomes of the text
+    double pointSize; ///< the size to draw it in
 };
 
 /// 50 pixels of the parent's width stay free. A text that is not wide at all fits.
@@ -30,9 +31,9 @@ ZELKOV_WIDGETS_EXPORT BusyTextFit fitBusyText(int parentWidth, int textWidth, do
 /// Where the spinner and the text line of the busy overlay go, in its own coordinates, and its size.
 struct BusyLayout
 {
-    QPoint icon;
-    QRect label;
-    QSize size;
+    QPoint icon; ///< top left corner of the spinner
+    QRect label; ///< of the text line
+    QSize size; ///< of the whole overlay
 };
 
 /// The gap of 6 pixels counts in the height even where there is no text: clients rely on it.

@@ -49,7 +49,9 @@ public:
     void setErrorText(const QString& text);
     /// The error symbol outranks the other two.
     void showErrorSymbol(bool on);
+    /// True for the camera's symbol, false for the file server's.
     void changeRecordingSymbol(bool on);
+    /// Whether a frame without time shows dashes.
     void setForceShow(bool on);
     /// Whether the time can be edited.
     void setReadOnly(bool readOnly);
@@ -58,7 +60,9 @@ public:
     DateTimeEdit* getDateTimeEit() const; //!< spelled so: clients rely on it
 
 public Q_SLOTS:
+    /// Microseconds since the epoch; all bits set mean no time. The time that is shown already does nothing.
     void setFrametime(qulonglong time);
+    /// The time that the difference counts from, likewise.
     void setAnchortime(qulonglong time);
 
 Q_SIGNALS:

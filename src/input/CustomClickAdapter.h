@@ -22,6 +22,7 @@ class ISecurityManager;
 class ZELKOV_WIDGETS_EXPORT CustomClickAdapter
 {
 public:
+    /// Kinds of clicks.
     enum EClickType
     {
         ectNone = 0, ///< nothing was clicked yet
@@ -78,15 +79,15 @@ protected:
     /// Judges the press by the time since its beginning, once a press. Does nothing for a user who was refused.
     void evaluateClickTimespan();
 
-    QTimer m_longClickTimer;
-    QWidget* m_owner;
-    bool m_autoClick = true;
+    QTimer m_longClickTimer; ///< see longClickTimer()
+    QWidget* m_owner; ///< the button
+    bool m_autoClick = true; ///< see setAutoClick()
     bool m_evaluated = false; ///< the time of this press has been judged
-    QElapsedTimer m_pressTime;
-    EClickType m_clickType = ectNone;
-    int m_longClickSpan;
-    QString m_securityCheck;
+    QElapsedTimer m_pressTime; ///< runs from the press on
+    EClickType m_clickType = ectNone; ///< of the present or last click
+    int m_longClickSpan; ///< in milliseconds
+    QString m_securityCheck; ///< see setSecurityCheck()
     bool m_protected = false; ///< the last question refused the user
-    bool m_adminOnly = false;
+    bool m_adminOnly = false; ///< see setAdminOnly()
 };
 }

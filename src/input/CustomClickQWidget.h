@@ -27,6 +27,7 @@ Q_SIGNALS:
     /// A release after a press, or a call of click() or the other clicked(). \a checked is always false. To
     /// connect by address, pick it with QOverload<bool>::of().
     void clicked(bool checked);
+    // A button of the mouse went down, and up again wherever that was.
     void pressed();
     void released();
     /// For subclasses; never emitted here.
@@ -45,7 +46,7 @@ public:
     virtual void clicked();
 
 protected:
-    /// Do nothing; for subclasses, under the names that QAbstractButton has for them.
+    // Do nothing; for subclasses, under the names that QAbstractButton has for them.
     virtual void checkStateSet();
     virtual void nextCheckState();
 

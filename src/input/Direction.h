@@ -16,11 +16,13 @@ enum Direction : int
     dAny = 255 ///< whatever direction
 };
 
+/// Either of them.
 constexpr Direction operator|(Direction a, Direction b)
 {
     return static_cast<Direction>(static_cast<int>(a) | static_cast<int>(b));
 }
 
+/// What both have in common; 0 for nothing.
 constexpr Direction operator&(Direction a, Direction b)
 {
     return static_cast<Direction>(static_cast<int>(a) & static_cast<int>(b));

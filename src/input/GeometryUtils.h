@@ -40,7 +40,7 @@ public:
     /// Direction from one global position to another.
     static Direction direction(const QMouseEvent& from, const QMouseEvent& to);
 
-    /// Index under a mouse event; any other event gives an invalid index.
+    // Index under a mouse event; any other event gives an invalid index.
     static QModelIndex indexAt(const QTableView* view, QEvent* event);
     static QModelIndex indexAt(const QTableView* view, QMouseEvent* event);
     /// @p p in global coordinates.

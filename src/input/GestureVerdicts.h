@@ -13,8 +13,8 @@ namespace vx
 /// One moment of a gesture: where the pointer was (global coordinates) and when (ms).
 struct GestureSample
 {
-    QPoint position;
-    qint64 time = 0;
+    QPoint position; ///< global, in pixels
+    qint64 time = 0; ///< in milliseconds
 };
 
 /// The thresholds in force for one gesture.
@@ -51,6 +51,7 @@ inline QPoint offset(const QPoint& from, const QPoint& to)
     return {cut(qint64(to.x()) - from.x()), cut(qint64(to.y()) - from.y())};
 }
 
+/// Whether the way from one point to the other has one of the wanted directions.
 inline bool heads(Direction wanted, const QPoint& from, const QPoint& to)
 {
     return (wanted & GeometryUtils::direction(offset(from, to))) != 0;
@@ -72,6 +73,7 @@ inline bool isLongPress(bool buttonsMatch, const GestureSample& press, const Ges
         && distance(press.position, last.position) <= limits.clickRadius;
 }
 
+/// Released once, out of the click radius, within the swipe interval, in a wanted direction.
 inline bool wasSwipe(Direction wanted, const GestureSample& press, const GestureSample& release, int releases,
     const GestureLimits& limits)
 {
@@ -97,6 +99,7 @@ inline bool wasDoubleClick(bool buttonsMatch, const GestureSample& press, const 
         && elapsed(press.time, release.time) <= limits.doubleClickInterval;
 }
 
+/// Released once within the click radius, at the long click interval or later.
 inline bool wasLongClick(bool buttonsMatch, const GestureSample& press, const GestureSample& release, int releases,
     const GestureLimits& limits)
 {
@@ -105,6 +108,7 @@ inline bool wasLongClick(bool buttonsMatch, const GestureSample& press, const Ge
         && elapsed(press.time, release.time) >= limits.longClickInterval;
 }
 
+/// Released once within the click radius, before the long click interval.
 inline bool wasSingleClick(bool buttonsMatch, const GestureSample& press, const GestureSample& release,
     int releases, const GestureLimits& limits)
 {

@@ -91,7 +91,7 @@ public:
     void stopAnimation();
 
 Q_SIGNALS:
-    /// Hovering; only with hasMouseTracking().
+    // Hovering; only with hasMouseTracking().
     void entered(vx::MouseEvent event);
     void left(vx::MouseEvent event);
     void moved(vx::MouseEvent event);
@@ -100,7 +100,7 @@ Q_SIGNALS:
     /// A button went up. Comes a second time when the long click interval ends a gesture that was already
     /// released, which needs a double click interval longer than the long click interval. Clients rely on it.
     void released(vx::MouseGesture::Ptr gesture);
-    /// The verdicts: at most one of clicked, doubleClicked, longClicked, panned, swiped a gesture, then finished.
+    // The verdicts: at most one of clicked, doubleClicked, longClicked, panned, swiped a gesture, then finished.
     void clicked(vx::MouseGesture::Ptr gesture);
     void doubleClicked(vx::MouseGesture::Ptr gesture);
     void longClicked(vx::MouseGesture::Ptr gesture);
@@ -111,12 +111,15 @@ Q_SIGNALS:
     void longPressed(vx::MouseGesture::Ptr gesture);
     /// Moved outside the click radius with a button down.
     void panning(vx::MouseGesture::Ptr gesture);
+    /// A drag that was released after the swipe interval; finished() follows.
     void panned(vx::MouseGesture::Ptr gesture);
+    /// A drag that was released within the swipe interval; finished() follows.
     void swiped(vx::MouseGesture::Ptr gesture);
     /// The gesture is over, whether it got a verdict or not. Not for canceled gestures.
     void finished(vx::MouseGesture::Ptr gesture);
 
 protected Q_SLOTS:
+    // The ends of the three intervals.
     void onLongClickTimeout();
     void onDoubleClickTimeout();
     void onAutoClickTimeout();

@@ -64,6 +64,7 @@ public:
 
     /// timeMillis() understood as time since the epoch.
     QDateTime time() const;
+    /// When it happened; see the class for what it counts from.
     qint64 timeMillis() const;
 
 protected:

@@ -27,8 +27,10 @@ namespace vx
 class ZELKOV_WIDGETS_EXPORT MouseGesture
 {
 public:
+    /// How gestures are handed out.
     using Ptr = QSharedPointer<vx::MouseGesture>;
 
+    /// The life of a gesture.
     enum State : int
     {
         gsIdle = 0, ///< nothing added yet
@@ -44,6 +46,7 @@ public:
     MouseGesture& operator=(MouseGesture&& other);
     ~MouseGesture();
 
+    // The first and the last event recorded.
     MouseEvent first() const;
     MouseEvent last() const;
     /// The n-th press, counted from 1. The second press of a double click is not recorded.
@@ -74,12 +77,12 @@ public:
 
     /// Live: held in place for the long click time, not released. Asked of an unfinished gesture.
     bool isLongPress(Qt::MouseButtons buttons) const;
-    /// Live: moved out of the click radius, not released.
+    // Live: moved out of the click radius, not released.
     bool isPan(vx::Direction direction) const;
     bool isPan(Qt::Orientation orientation) const;
 
-    /// The verdicts; true only for a finished gesture. Swipe and pan are drags out of the click radius: released
-    /// within the swipe interval it is a swipe, later a pan.
+    // The verdicts; true only for a finished gesture. Swipe and pan are drags out of the click radius: released
+    // within the swipe interval it is a swipe, later a pan.
     bool wasSingleClick(Qt::MouseButtons buttons) const;
     bool wasDoubleClick(Qt::MouseButtons buttons) const;
     bool wasLongClick(Qt::MouseButtons buttons) const;
@@ -90,6 +93,7 @@ public:
 
     /// From the latest press to the last event.
     QPoint panOffset() const;
+    /// The one direction nearest to panOffset().
     Direction panDirection() const;
     /// From the last event of the previous call (at first from the latest press) to the last event: increments for
     /// a slot of panning(). Asking moves the starting point.
@@ -98,9 +102,10 @@ public:
     Direction lastPanDirection() const;
     /// From the first press to the last event.
     QPoint swipeOffset() const;
+    /// The one direction nearest to swipeOffset().
     Direction swipeDirection() const;
 
-    /// Change the state; true if that changed anything. Finished and canceled are final.
+    // Change the state; true if that changed anything. Finished and canceled are final.
     bool finish();
     bool cancel();
     bool startOrUpdate();

@@ -50,7 +50,7 @@ protected:
     void checkStateSet() override;
     void nextCheckState() override;
 
-    QPointer<QObject> m_listener;
+    QPointer<QObject> m_listener; ///< see setListener()
 };
 
 extern template class ZELKOV_WIDGETS_EXPORT TCustomClickWidget<QToolButton>;

@@ -25,6 +25,7 @@ class ZELKOV_WIDGETS_EXPORT FilterPattern
 {
 public:
     FilterPattern() = default;
+    /// Looks once at how \a regExp is best tested.
     explicit FilterPattern(const QRegExp& regExp);
 
     /// Whether the pattern is compared as plain text.

@@ -14,7 +14,7 @@ namespace vx
 /// into which the cells wrap row by row (Qt::Vertical). Pairs are (row, column).
 struct ZELKOV_WIDGETS_EXPORT TableShape
 {
-    Qt::Orientation orientation = Qt::Horizontal;
+    Qt::Orientation orientation = Qt::Horizontal; ///< Qt::Horizontal: one long row
     int dimension = 1; ///< number of columns of the vertical form; always 1 in the horizontal one
 
     /// A shape with a dimension that is allowed: at least 1, and exactly 1 if horizontal.
@@ -22,6 +22,7 @@ struct ZELKOV_WIDGETS_EXPORT TableShape
 
     int rows(int cellCount) const;    ///< never negative; 1 in the horizontal form even without cells
     int columns(int cellCount) const; ///< never negative; the dimension in the vertical form even without cells
+    // The place of a cell, and the cell at a place. Nothing is checked against a number of cells.
     std::pair<int, int> position(int cell) const;
     int cell(const std::pair<int, int>& position) const;
 

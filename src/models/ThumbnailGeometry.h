@@ -23,7 +23,7 @@ ZELKOV_WIDGETS_EXPORT QRect fitWithAspectRatio(const QRect& rect, const QSize& s
 /// cover the rectangle. Without one of these and without a positional flag the result stands at (0, 0).
 ZELKOV_WIDGETS_EXPORT QRect align(const QSize& imageSize, const QRect& rect, int alignment);
 
-/// Height of the title bar, and the font size to start with, for a cell and a bar of @p height.
+// Height of the title bar, and the font size to start with, for a cell and a bar of @p height.
 ZELKOV_WIDGETS_EXPORT int titleHeight(int height, bool scaled);
 ZELKOV_WIDGETS_EXPORT int fontSize(int height, bool scaled);
 

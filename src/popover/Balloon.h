@@ -72,6 +72,7 @@ public:
     };
     Q_DECLARE_FLAGS(EArrowDirections, EArrowDirection)
 
+    /// The parts of the title bar.
     enum EBalloonFeature : int
     {
         ebfClose = 1, ///< close button visible
@@ -81,6 +82,7 @@ public:
     };
     Q_DECLARE_FLAGS(EBalloonFeatures, EBalloonFeature)
 
+    /// The sides of the configured size that count.
     enum ESizeConstraint : int
     {
         escWidth = 1, ///< the configured width replaces the width of the content
@@ -95,10 +97,12 @@ public:
         QFlags<EArrowDirection> directions, const QSizeF& size, QFlags<ESizeConstraint> constraints);
     ~Balloon() override;
 
+    // See the properties of the same names.
     int spacing() const;
     void setSpacing(int spacing);
     int innerMargin() const;
     void setInnerMargin(int margin);
+    // Least distances from the edges of the parent. Default 4; in force at once while the balloon is visible.
     int topBorderMargin() const;
     void setTopBorderMargin(int margin);
     int bottomBorderMargin() const;
@@ -136,6 +140,7 @@ public:
     /// Shows and hides the parts of the title bar.
     void setFeatures(QFlags<EBalloonFeature> features);
     QFlags<EBalloonFeature> getFeatures() const;
+    /// The text of the title; shown with ebfTitle.
     void setTitle(const QString& title);
     /// The four border margins.
     void margins(int& left, int& top, int& right, int& bottom) const;

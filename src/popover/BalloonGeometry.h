@@ -37,8 +37,8 @@ enum Side : int
 /// One of the strips above and below the rows.
 struct Strip
 {
-    bool shown = false;
-    QSize hint;
+    bool shown = false; ///< whether it takes room
+    QSize hint; ///< the size that it asks for
 };
 
 /// The place of @p node in the coordinates of @p parent, through their nearest common ancestor. Nodes have pos(),
@@ -108,7 +108,7 @@ ZELKOV_WIDGETS_EXPORT bool arrowDrawn(int allowed, const QRectF& inner, const QP
 ZELKOV_WIDGETS_EXPORT QPainterPath outline(
     const QRectF& inner, int radius, bool arrow, int arrowWidth, int side, const QPointF& anchor);
 
-/// To whole pixels; edges beyond any widget's are cut.
+// To whole pixels; edges beyond any widget's are cut.
 ZELKOV_WIDGETS_EXPORT QRect toRect(const QRectF& rect);
 ZELKOV_WIDGETS_EXPORT QPoint toPoint(const QPointF& point);
 }

@@ -22,7 +22,7 @@ struct ZELKOV_WIDGETS_EXPORT BalloonLook
 
     QColor lower; ///< at the end of the gradient
     QColor upper; ///< from its middle on
-    QColor border;
+    QColor border; ///< of the outline; invalid for none
 };
 }
 }

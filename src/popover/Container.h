@@ -47,6 +47,7 @@ class ZELKOV_WIDGETS_EXPORT Container : public QWidget
     Q_PROPERTY(int layoutOrientation READ layoutOrientation)
 
 public:
+    /// An empty box of items in a row or a column; \a alignment is that of its layout.
     Container(QWidget* parent, const QString& objectName, Qt::Orientation orientation,
         QFlags<Qt::AlignmentFlag> alignment);
     ~Container() override;
@@ -54,6 +55,7 @@ public:
     /// Pixels between the items; 0 at first. So are the margins below, which start as the style's.
     virtual void setSpacing(int spacing);
     virtual int spacing() const;
+    // Room at the end of the layout; as QBoxLayout has it.
     virtual void addStretch(int stretch);
     virtual void addSpacing(int size);
     virtual void addSpacer(QSizePolicy::Policy policy, int width, int height);
@@ -61,13 +63,16 @@ public:
     /// Adds an item at the end; what it does when performed is said by @p flags, or by its own defaultItemFlags().
     /// Returns the item. A null item is ignored.
     virtual Item* addItem(Item* item, QFlags<EContainerFlag> flags);
+    /// The same with the flags of Item::defaultItemFlags().
     virtual Item* addItem(Item* item);
     /// @p index counts everything in the layout, spacers included; -1 appends. In the list of items, and so in
     /// searches, an inserted item comes last.
     virtual Item* insertItem(Item* item, QFlags<EContainerFlag> flags, int index);
+    /// The same with the flags of Item::defaultItemFlags().
     virtual Item* insertItem(Item* item, int index);
     /// Adds a WidgetItem that holds @p widget. It is found like other items, but its signals go nowhere.
     virtual void addWidgetItem(QWidget* widget, const QString& objectName, int id);
+    /// The same at a place of the layout.
     virtual void insertWidgetItem(QWidget* widget, int index, const QString& objectName, int id);
 
     /// Takes all items out, and deletes them at once if @p deleteItems; otherwise they live on as children of the
@@ -92,6 +97,7 @@ public:
     /// Hands itemPerformed() of the item on, unless it has eifNoForward, and its layoutChanged(), queued.
     virtual void applyDefaultConnects(Item* item);
 
+    // Pixels around the items; those of the style at first.
     int leftMargin() const;
     void setLeftMargin(int margin);
     int topMargin() const;
@@ -107,7 +113,9 @@ public:
     void addContainer(Container* container);
     /// Ignored if there is one already.
     void addHeader(Container* header);
+    /// Ignored if there is one already.
     void addFooter(Container* footer);
+    // Null without one.
     Container* header() const;
     Container* footer() const;
     /// Deletes all items, header and footer.
@@ -115,24 +123,30 @@ public:
     /// Takes the first item with that id out; it is deleted later. Emits nothing.
     void removeItem(int id);
 
+    /// All items: own ones and after a submenu those in it, then those of header, footer and nested containers.
     QList<Item*> getItems() const;
+    /// Those of them with that id; does not enter submenus with eifNoForward.
     QList<Item*> getItems(int id) const;
+    /// Those of getItems() with these user data.
     QList<Item*> getItemsByUserData(const QVariant& userData) const;
     /// Does not look into nested containers, and takes at most one item from a submenu. Odd on purpose.
     QList<Item*> getItemsByValue(const QVariant& value) const;
     /// The first that the list of the same name would hold, or null.
     Item* getItem(int id) const;
+    // The first that the list of the same name would hold, or null.
     Item* getItemByUserData(const QVariant& userData) const;
     Item* getItemByValue(const QVariant& value) const;
     /// The first item with that id whose value is true.
     Item* getSelectedItem(int id) const;
     /// Of the whole tree, with duplicates.
     QList<int> getItemIDs() const;
+    /// Whether getItem() finds one.
     bool itemExists(int id) const;
     /// Whether it is a direct item.
     bool hasItem(Item* item) const;
     /// Index in the layout, -1 for what is not in it.
     int itemIndex(int id) const;
+    /// Index in the layout, -1 for what is not in it.
     int itemIndex(QWidget* widget) const;
 
     // On the first item with that id.
@@ -149,9 +163,11 @@ public:
     void setItemValue(int id, const QVariant& value, bool emitSignal);
     /// On all direct items with that id, and on no others.
     void setItemBusy(int id, bool busy, bool hideLast, bool emitSignal);
+    /// On the first item with that id.
     void setItemVisibility(int id, bool visible, bool emitSignal);
     /// Each id in turn, with a signal for each.
     void setItemVisibility(const QList<int>& ids, bool visible, bool emitSignal);
+    // On the first item with that id; both are the same.
     void setItemEnabled(int id, bool enabled, bool emitSignal);
     void enableItem(int id, bool enabled, bool emitSignal);
     // On all items with that id.
@@ -180,11 +196,17 @@ public:
     void raiseContainer(QWidget* over);
 
 Q_SIGNALS:
+    /// The content may want another size. Of operations on the container only while it is visible; of a row one
+    /// turn of the event loop later, visible or not.
     void layoutChanged();
+    /// A row that was added with ecfDismiss is being performed; comes before its itemPerformed().
     void dismissPopover();
+    /// The same for ecfDismissAll; comes after dismissPopover().
     void dismissAllPopover();
+    /// A row of this container or of one in it was performed; not for rows with eifNoForward.
     void itemPerformed(
         int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
+    // From popoverClosing() and popoverOpening().
     void popoverAboutToClose();
     void popoverAboutToOpen();
 
@@ -205,13 +227,13 @@ protected:
     /// Puts an item into the list of items.
     void append(Item* item);
 
-    QBoxLayout* m_layout;
-    QPointer<Container> m_header;
-    QPointer<Container> m_footer;
-    QList<QPointer<Item>> m_items;
-    QList<QPointer<Container>> m_containers;
-    int m_orientation;
-    int m_autoFocusItem = -1;
+    QBoxLayout* m_layout; ///< holds the items
+    QPointer<Container> m_header; ///< placed by the balloon
+    QPointer<Container> m_footer; ///< placed by the balloon
+    QList<QPointer<Item>> m_items; ///< in the order in which they were added
+    QList<QPointer<Container>> m_containers; ///< nested ones
+    int m_orientation; ///< Qt::Vertical or Qt::Horizontal
+    int m_autoFocusItem = -1; ///< see setAutoFocusItem()
 
 private:
     template <class Visitor> bool walk(bool intoNoForward, const Visitor& visitor) const;

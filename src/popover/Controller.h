@@ -82,13 +82,16 @@ public:
     /// exists then and is about to fade. If it was deleted while it waited, the result is 0.
     int exec(QFlags<QDialogButtonBox::StandardButton> buttons);
 
+    /// Shows and hides the parts of the title bar; needs the balloon.
     void setBalloonFeatures(QFlags<Balloon::EBalloonFeature> features);
+    /// The title of the balloon.
     void setTitle(const QString& title);
     QString title() const;
 
     /// Insets are added to the rectangle of a covered window as they stand: right and bottom ones shrink it only
     /// if they are negative. They have no effect over another controller. Default 0.
     void setInsets(int left, int top, int right, int bottom);
+    /// Adds to the present insets.
     void adjustInsets(int left, int top, int right, int bottom);
     void getInsets(int& left, int& top, int& right, int& bottom) const;
     /// See setMargins().
@@ -107,6 +110,7 @@ public:
     bool isActive() const;
     /// As the creator said; nothing in here depends on it.
     bool isSubController() const;
+    /// See exec(); 0 at first.
     int resultCode() const;
     /// Null before setContainer().
     Balloon* balloon() const;
@@ -121,13 +125,16 @@ Q_SIGNALS:
     void balloonOpened();
     /// Closing has begun; exec() returns now.
     void balloonClosed();
+    /// The opening begins.
     void popoverWillAppear();
     /// The fade-in is over, which without a fade is before the balloon is shown. With epsGrow it comes a second
     /// time when the balloon has its size.
     void popoverDidAppear();
+    /// After balloonClosed(); the fade begins.
     void popoverWillDisappear();
     /// The overlay is hidden. With epsGrow and a fade it comes twice if the controller lives on.
     void popoverDidDisappear();
+    /// The help button was clicked, or help() called.
     void popoverWillHelp();
     /// Return or Enter was released.
     void shouldAccept();
@@ -136,6 +143,7 @@ Q_SIGNALS:
     /// An item of the content was performed.
     void itemPerformed(
         int itemId, const QVariant& value, const QVariant& userData, vx::PopoverWidget::EItemPerformedFlags flag);
+    /// The margins were set; a layout pass follows.
     void marginsChanged(int left, int top, int right, int bottom);
     /// A layout pass has run. A resize of the window runs more than one.
     void layoutUpdated();
@@ -156,9 +164,11 @@ public Q_SLOTS:
     void updateLayout(bool force = false);
     /// Closes, unless the popover stays visible or Container::canBeClosed() says no. \a force asks nobody.
     virtual void dismiss(bool animated = true, bool force = false);
+    /// Emits popoverWillHelp().
     void help();
     /// dismiss(false, false).
     void close();
+    /// What exec() returns.
     void setResultCode(int code);
     void setAccepted(); ///< Result 1; does not close.
     void setRejected(); ///< Result 0; does not close.
@@ -179,6 +189,7 @@ protected:
     Controller(QWidget* inWidget, QWidget* forWidget, bool isSubController, const QString& objectName,
         QFlags<Balloon::EArrowDirection> directions, const QSizeF& size,
         QFlags<Balloon::ESizeConstraint> constraints);
+    /// The same without a target.
     Controller(QWidget* inWidget, bool isSubController, const QString& objectName, const QSizeF& size,
         QFlags<Balloon::ESizeConstraint> constraints);
 
@@ -240,6 +251,7 @@ private:
 Q_DECLARE_OPERATORS_FOR_FLAGS(Controller::EPopoverShowFlags)
 }
 
+/// How controllers are handed around; null once one is gone.
 using TPopoverControllerPointer = QPointer<PopoverWidget::Controller>;
 }
 

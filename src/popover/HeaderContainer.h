@@ -17,6 +17,7 @@ class ZELKOV_WIDGETS_EXPORT HeaderContainer : public Container
     Q_OBJECT
 
 public:
+    /// As Container.
     HeaderContainer(QWidget* parent, const QString& objectName, Qt::Orientation orientation,
         QFlags<Qt::AlignmentFlag> alignment);
     ~HeaderContainer() override;

@@ -86,6 +86,7 @@ public:
     virtual void setBusyText(const QString& text, bool hideLast);
     /// The widget that takes the focus for the item, or null.
     virtual QWidget* getFocusItem();
+    /// Of all elements.
     virtual void setElideMode(Qt::TextElideMode mode);
     /// Ends whatever the item's control animates. The base class does nothing.
     virtual void cancelAnimations();
@@ -98,14 +99,17 @@ public:
     /// single from double clicks override this.
     virtual void performSingleClick(QFlags<EItemPerformedFlag> flags);
 
+    /// As given to the constructor; ids need not be unique.
     int id() const;
+    /// As given to the constructor.
     QFlags<EItemFlag> itemFlags() const;
-    /// The elements; null for those that the item was not given.
+    // The elements; null for those that the item was not given.
     ElidedButton* iconElement() const;
     ElidedButton* textElement() const;
     ElidedButton* additionalTextElement() const;
     BadgeWidget* busyWidget() const;
 
+    /// What itemPerformed() carries besides the value; the client's own affair.
     void setUserData(const QVariant& userData);
     /// A text beside the icon, in the icon element, escaped. Emits layoutChanged().
     void setIconText(const QString& text);
@@ -113,6 +117,7 @@ public:
     /// Space between the elements, in pixels. Default 5.
     void setSpacing(int spacing);
     int spacing() const;
+    // Margins of the row, in pixels.
     void setLeftMargin(int margin);
     int leftMargin() const;
     void setRightMargin(int margin);
@@ -178,6 +183,7 @@ protected:
     /// Calls performSingleClick(@p flags) when no second click has come in the system's double click interval and
     /// 50 milliseconds. The release that ends a double click starts nothing.
     void startDoubleClickTimer(QFlags<EItemPerformedFlag> flags);
+    /// Gives up the single click that waits.
     void stopDoubleClickTimer();
     /// performSingleClick() with eipDoubleClick added.
     void performDoubleClick(QFlags<EItemPerformedFlag> flags);
@@ -188,27 +194,27 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void showEvent(QShowEvent* event) override;
 
-    ElidedButton* m_iconElement = nullptr;
-    ElidedButton* m_textElement = nullptr;
-    ElidedButton* m_additionalTextElement = nullptr;
-    QHBoxLayout* m_mainLayout = nullptr;
+    ElidedButton* m_iconElement = nullptr; ///< null if the item has none
+    ElidedButton* m_textElement = nullptr; ///< likewise
+    ElidedButton* m_additionalTextElement = nullptr; ///< likewise
+    QHBoxLayout* m_mainLayout = nullptr; ///< of the whole row
     QHBoxLayout* m_leftLayout = nullptr; // null with flags 0
     QHBoxLayout* m_rightLayout = nullptr; // null with flags 0
-    int m_id;
-    QFlags<EItemFlag> m_flags;
-    QVariant m_userData;
-    BadgeWidget* m_busyWidget = nullptr;
+    int m_id; ///< see id()
+    QFlags<EItemFlag> m_flags; ///< see itemFlags()
+    QVariant m_userData; ///< see setUserData()
+    BadgeWidget* m_busyWidget = nullptr; ///< hidden unless busy
     QPointer<QWidget> m_lastElement; // what the busy mark takes the place of
-    bool m_dragEnabled = false;
-    QString m_dragMimeType;
-    QMap<QString, QByteArray> m_dragMimeData;
+    bool m_dragEnabled = false; ///< see setDragEnabled()
+    QString m_dragMimeType; ///< see setDragMimeType()
+    QMap<QString, QByteArray> m_dragMimeData; ///< see setDragMimeData()
     QPoint m_dragStart; // own coordinates
     bool m_protected = true; // of the last isProtected()
-    bool m_adminOnly = false;
-    int m_spacing = 5;
-    QString m_securityCheck;
+    bool m_adminOnly = false; ///< see setAdminOnly()
+    int m_spacing = 5; ///< between the elements, in pixels
+    QString m_securityCheck; ///< see setSecurityCheck()
     QString m_resetText; // of the context menu
-    QPointer<QTimer> m_doubleClickTimer;
+    QPointer<QTimer> m_doubleClickTimer; ///< see startDoubleClickTimer()
 
 private:
     ElidedButton* createElement(const QString& objectName, const QString& text, bool fillsBackground);

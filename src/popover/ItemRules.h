@@ -22,9 +22,9 @@ namespace ItemRules
 /// Where the elements of an item lie. An element that the item does not have is a null rectangle.
 struct Elements
 {
-    QRect icon;
-    QRect text;
-    QRect additionalText;
+    QRect icon; ///< of the icon element
+    QRect text; ///< of the text element
+    QRect additionalText; ///< of the element at the right
 };
 
 /// The first of icon, text and additional text that contains @p position, or 0, and the bit of the button; buttons

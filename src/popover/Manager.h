@@ -43,6 +43,7 @@ public:
     static void init(int firstId);
     /// Null before init() and after deleteInstance().
     static Manager* instance();
+    /// Deletes the instance; controllers live on.
     static void deleteInstance();
 
     ~Manager() override;
@@ -72,6 +73,7 @@ public:
     QPointer<Controller> getController(int id) const;
     /// The entry of this very object, or null.
     QPointer<Controller> getController(Controller* controller) const;
+    /// All that are entered under the id.
     QList<QPointer<Controller>> getControllers(int id) const;
     /// 0 for a controller that is not entered.
     int getControllerID(Controller* controller) const;
@@ -84,6 +86,7 @@ public:
     Item* getItem(int id, int itemId) const;
     /// The first item whose value is true.
     Item* getSelectedItem(int id, int itemId) const;
+    // Of the first item with that id in the popover; a null variant without one.
     QVariant getItemValue(int id, int itemId) const;
     QVariant getItemUserData(int id, int itemId) const;
 
@@ -100,12 +103,14 @@ public:
     /// Whether a popover is open and, unless \a window is null, the current one belongs to that window. Popovers
     /// other than the current one do not count.
     bool anyPopoverOpen(QWidget* window) const;
+    /// The same for modal popovers.
     bool anyModalPopoverOpen(QWidget* window) const;
 
     /// Dismisses all controllers of the id.
     void dismiss(int id, bool animated, bool force);
     /// Dismisses all controllers, or those of a window. They need not be open.
     void dismissAll(QWidget* window, bool animated, bool force);
+    /// The same for modal popovers.
     void dismissAllModal(QWidget* window, bool animated, bool force);
 
     /// Adds to the insets of all active controllers over \a inWidget.
@@ -120,6 +125,8 @@ public:
     void restoreControllersForMimeType(const QString& type);
 
 Q_SIGNALS:
+    // Controller by controller, as each of them emits popoverWillAppear(), popoverDidAppear(),
+    // popoverWillDisappear() and popoverDidDisappear().
     void popoverWillOpen(vx::TPopoverControllerPointer controller);
     void popoverDidOpen(vx::TPopoverControllerPointer controller);
     void popoverWillClose(vx::TPopoverControllerPointer controller);
@@ -130,11 +137,14 @@ Q_SIGNALS:
     void modalPopoverDidOpen(vx::TPopoverControllerPointer controller);
     /// No popover is open any more. Comes after popoverDidClose(), whichever popover that was for.
     void lastPopoverDidClose();
+    /// No modal popover is open any more; after lastPopoverDidClose().
     void lastModalPopoverDidClose();
     /// After popoverWillClose() if nothing is open. A visible popover that begins to close still counts as open,
     /// so that this does not come for an ordinary closing; clients rely on it.
     void lastPopoverWillClose();
+    /// The same for modal popovers.
     void lastModalPopoverWillClose();
+    /// The help button of a popover was clicked.
     void popoverWillHelp(vx::TPopoverControllerPointer controller);
 
 private Q_SLOTS:

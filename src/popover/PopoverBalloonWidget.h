@@ -49,6 +49,7 @@ public:
     void setItemMapEnabled(bool enabled);
     /// For the next popover that is made. Default title and close button.
     void setBalloonFeatures(QFlags<vx::PopoverWidget::Balloon::EBalloonFeature> features);
+    // For the next popover that is made.
     void setBalloonTitle(const QString& title);
     void setControllerID(int controllerId);
 
@@ -62,6 +63,7 @@ public:
 
     /// The popover, made if there is none, and moved to where the control is now. Null without a Manager.
     QPointer<vx::PopoverWidget::Controller> getController();
+    /// Whether there is a popover; makes none.
     bool hasController() const;
 
 protected:
@@ -69,7 +71,7 @@ protected:
     bool popoverOpen() const;
     /// The window of the control, or the active window if that is none or embedded in a graphics scene.
     QWidget* obtainWindow();
-    /// The row or the text of the first range that contains the value; null or empty without one.
+    // The row or the text of the first range that contains the value; null or empty without one.
     QPointer<vx::PopoverWidget::Item> getBalloonItemForValue(int value);
     QString getBalloonTextForValue(int value);
     /// Deletes the rows that never got into a popover and takes them out of the map.

@@ -17,6 +17,7 @@ class ZELKOV_WIDGETS_EXPORT WidgetItem : public Item
     Q_OBJECT
 
 public:
+    /// Takes \a widget over; null gives an empty row.
     WidgetItem(QWidget* widget, const QString& objectName, int id, QWidget* parent);
     ~WidgetItem() override;
 

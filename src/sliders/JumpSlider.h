@@ -25,6 +25,7 @@ class ZELKOV_WIDGETS_EXPORT JumpSlider : public QSlider
 public:
     /// A vertical slider, as QSlider makes it.
     explicit JumpSlider(QWidget* parent = nullptr);
+    /// With that orientation.
     explicit JumpSlider(Qt::Orientation orientation, QWidget* parent = nullptr);
     ~JumpSlider() override;
 

@@ -73,6 +73,7 @@ public:
     static constexpr unsigned int s_FlagLongPressThreshold = 1000; ///< ms
     static constexpr double s_OpacityFadeValue = 0.25; ///< opacity of an inactive slider
 
+    /// Bits of what the slider does besides.
     enum EMultiNubsieSliderFeatures : int
     {
         emfShowRangeLabels = 0x01, ///< numbers of minimum and maximum while a handle is in use
@@ -84,6 +85,7 @@ public:
     };
     Q_DECLARE_FLAGS(MultiNubsieSliderFeatures, EMultiNubsieSliderFeatures)
 
+    /// Pictures of a flag.
     enum EMultiNubsieSliderFlagColor : int
     {
         efcRed = 0,
@@ -108,11 +110,14 @@ public:
     void addNubsie(Nubsie* nubsie);
     /// Deletes the handle.
     void removeNubsie(const int& id);
+    /// Deletes all handles.
     void removeAllNubsies();
     /// In the order in which they are searched under the pointer; a press moves the handle to the end.
     QList<QPointer<Nubsie>> getNubsies() const;
 
+    /// The handle with that id, or null.
     Nubsie* nubsie(const int& id) const;
+    /// Whether a handle has that id.
     bool nubsieExists(const int& id) const;
     /// Whether the handle is held by the mouse button.
     bool nubsieGrabbed(const int& id) const;
@@ -121,12 +126,14 @@ public:
     /// What the client wished by setNubsieVisible().
     bool nubsieVisible(int id) const;
     void setNubsieVisible(int id, bool visible);
+    /// Shows or hides all handles.
     void setNubsiesVisible(bool visible);
 
     // --- Values ------------------------------------------------------------------------------------------------
 
     /// The true value, also of an inverted handle.
     int value(const int& id) const;
+    // The handle's own range.
     int minimum(const int& id) const;
     int maximum(const int& id) const;
     /// Nothing if the handle has that value. A held handle takes the value and stays drawn where it is until it is
@@ -137,8 +144,10 @@ public:
     /// Clamps the value and emits nubsieValueChangedByUser if the range differs from the present one. Moves a held
     /// handle, too, until its next drag step.
     void setRange(const int& id, int minimum, int maximum);
+    /// What resets go back to; at first the middle of the range.
     void setDefaultValues(const int& id, int value);
 
+    // Of handles in date mode, see Nubsie::setStartEndDate().
     QDateTime getDate(const int& id) const;
     QDateTime startDate(const int& id) const;
     QDateTime endDate(const int& id) const;
@@ -148,15 +157,18 @@ public:
     void setStartEndDates(const int& id, const QDateTime& start, const QDateTime& end);
     /// Lets a date handle show its distance from an anchor, in ms, and its red icon. 0 is ignored.
     void setDateDiff(const int& id, qint64 milliseconds);
+    /// Ends that.
     void clearDateDiff(const int& id);
 
     // --- Features and looks of a handle: see Nubsie ------------------------------------------------------------
 
     /// The features in force at the present value.
     QFlags<Nubsie::ENubsieFeatures> getFeatures(const int& id) const;
+    /// The handle's own features, see Nubsie::setFeatures().
     void setFeatures(const int& id, QFlags<Nubsie::ENubsieFeatures> features);
     /// Makes the features in force and the given ones the handle's own.
     void addFeatures(const int& id, QFlags<Nubsie::ENubsieFeatures> features);
+    // As the functions of Nubsie; the standard size is that of Nubsie::setSize().
     void setStandardSize(const int& id, QSize size);
     void setDraggedSize(const int& id, QSize size);
     void setIcon(const int& id, const QPixmap& icon);
@@ -173,6 +185,7 @@ public:
     void setPopoverID(const int& id, int controllerId, const QString& title);
     /// @p duration of one pulse in ms; 0 leaves it as it is.
     void startBlinkingNubsie(const int& id, int duration = 0);
+    // As the functions of Nubsie.
     void stopBlinkingNubsie(const int& id);
     bool isBlinkingNubsie(const int& id) const;
 
@@ -194,7 +207,9 @@ public:
 
     /// 0x0C by default.
     QFlags<EMultiNubsieSliderFeatures> getFeatures() const;
+    /// Bits of EMultiNubsieSliderFeatures. Gives the slider the opacity that it has without the pointer.
     void setFeatures(QFlags<EMultiNubsieSliderFeatures> features);
+    // Qt::Horizontal by default.
     Qt::Orientation orientation() const;
     void setOrientation(Qt::Orientation orientation);
     /// The bar is half as thick as this, and at least one pixel; 5 by default.
@@ -226,14 +241,18 @@ public:
 
     // --- Flags -------------------------------------------------------------------------------------------------
 
+    /// Shows or hides both flags. At first they are hidden.
     void showFlags(bool show);
     /// Also gives the flag its picture at half the slider's thickness.
     void setFirstFlagColor(EMultiNubsieSliderFlagColor color);
+    /// Likewise.
     void setSecondFlagColor(EMultiNubsieSliderFlagColor color);
     EMultiNubsieSliderFlagColor getFirstFlagColor() const;
+    /// Likewise.
     EMultiNubsieSliderFlagColor getSecondFlagColor() const;
     /// The labels, for the client to place in the slider's coordinates; the slider itself never does.
     QWidget* getFirstFlag() const;
+    /// Likewise.
     QWidget* getSecondFlag() const;
 
     // --- Geometry ----------------------------------------------------------------------------------------------
@@ -262,18 +281,23 @@ Q_SIGNALS:
     void nubsieValueChangedByUser(vx::NubsieID nubsieID, int value);
     /// A handle was pressed, whether a drag follows or a click.
     void nubsieDragStarted(vx::NubsieID nubsieID);
+    /// The handle was let go after a drag, was double-clicked or reset. Not after a click.
     void nubsieDragEnded(vx::NubsieID nubsieID);
     /// Emitting it lays all handles out one turn of the event loop later.
     void triggerNubsieRepaintQueued(bool animate);
     /// Pressed and released on the flag within s_FlagLongPressThreshold.
     void firstFlagClicked();
+    /// Likewise.
     void secondFlagClicked();
     /// Held for s_FlagLongPressThreshold; no click follows.
     void firstFlagLongClicked();
+    /// Likewise.
     void secondFlagLongClicked();
     /// At the press of the right button.
     void firstFlagRightClicked();
+    /// Likewise.
     void secondFlagRightClicked();
+    // At the second press; the first click has been reported as one.
     void firstFlagDoubleClicked();
     void secondFlagDoubleClicked();
 
@@ -288,6 +312,7 @@ public Q_SLOTS:
     void stackNubsiesUnder(QWidget* widget);
     void stackNubsiesOver(QWidget* widget);
     void raiseNubsieOverRivals();
+    /// Lays all handles out now.
     void repaintNubsiesImmediately();
     /// Lays all visible handles out.
     void updateNubsiePositions(bool animated = true);

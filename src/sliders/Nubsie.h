@@ -89,6 +89,7 @@ public:
     };
     Q_FLAG(ENubsieState)
 
+    /// The id of no handle.
     static constexpr int s_InvalidNubsieID = -1;
     /// Milliseconds of one pulse of the glow.
     static constexpr unsigned int s_DefaultBlinkDuration = 1500;
@@ -107,6 +108,7 @@ public:
     explicit Nubsie(QWidget* parent);
     ~Nubsie() override;
 
+    /// The number that clients know it by.
     int id() const;
 
     /// Shown by the slider over the handle.
@@ -159,9 +161,11 @@ public:
     void setFeatureMap(const QMap<ValueRange, Features>& map);
     /// The features in force at the present value.
     QFlags<ENubsieFeatures> getCurrentFeature() const;
+    // Of setFeatures() alone: whether it has enfDraggable, and enfMoveable.
     bool isDraggable() const;
     bool isMoveable() const;
 
+    // A client's own bits; the handle keeps them and is not clipped while one is set.
     void setState(QFlags<ENubsieState> state);
     void addState(QFlags<ENubsieState> state);
     void unsetState(QFlags<ENubsieState> state);
@@ -175,6 +179,7 @@ public:
     /// and repaints. Without @p updateDisplay the handle stays where it is drawn. Emits valueChanged(), also for
     /// the present value, unless @p emitSignal is false.
     void setValue(int value, bool emitSignal = true, bool updateDisplay = true);
+    // Only stored.
     int defaultValue() const;
     void setDefaultValue(int value);
     int maximum() const;
@@ -197,6 +202,7 @@ public:
 
     /// Stores the dates at minimum and maximum; value and place stay.
     void setStartEndDate(const QDateTime& start, const QDateTime& end);
+    // The dates at minimum and maximum; invalid at first.
     QDateTime getStartDate() const;
     QDateTime getEndDate() const;
     /// Sets the value, cut off to a whole one, that stands for the date.
@@ -233,9 +239,11 @@ public:
     void moveTo(const QPointF& point);
     /// Stops growing, shrinking and sliding; takes the size at rest and stays at getPosition().
     void cancelAnimations();
+    // The animations themselves; owned by the handle.
     QPropertyAnimation* sizeAnimator();
     QPropertyAnimation* positionAnimator();
 
+    // How strong the glow shows, 0 to 1; what startBlinking() animates.
     double getGlowOpacity() const;
     void setGlowOpacity(double opacity);
 
@@ -311,23 +319,28 @@ public Q_SLOTS:
     void setPosition(QPointF pos);
     /// Shows the value, the date or the interval in the balloon; a hidden handle takes its balloon away.
     void updateBalloon();
+    /// Closes the balloon, if there is one.
     void hideBalloon();
     /// Lets the glow pulse until stopBlinking(), one pulse taking @p duration ms; 0 and less keep the present
     /// duration.
     void startBlinking(int duration = 0);
     /// Back to the default duration. The last glow stays until the next paint: clients rely on it.
     void stopBlinking();
+    /// Whether the glow pulses.
     bool isBlinking() const;
     /// The perform functions call the slot for the value and give whether there was one.
     bool performLongClick();
+    // Calls the slot for the value. Gives whether there was one.
     bool performClick();
     bool performDrag();
     /// Called by the slider after each step of a drag: false if the integer value is the previous one. Otherwise,
     /// under enfLiveDrag in force, calls the drag slot and emits valueChanged().
     bool performDragAction();
+    // Calls the slot for the value. Gives whether there was one.
     bool performDoubleClick();
     bool performPress();
     bool performRelease(QPoint globalPos);
+    /// Forgets that the present gesture was a click or a long click.
     void clearClickOrLongClickOccured();
     /// Shows only if externallyVisible().
     void setVisible(bool visible) override;

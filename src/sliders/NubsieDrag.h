@@ -37,6 +37,7 @@ ZELKOV_WIDGETS_EXPORT double speed(double side, double border, double reach, dou
 /// @p target: by its share of the step, but never farther behind the pointer than 1 - @p speed.
 ZELKOV_WIDGETS_EXPORT double laggedTarget(double speed, double step, double display, double target);
 
+/// What a drag has begun with.
 struct Anchor
 {
     double display; ///< where the handle was drawn at the press
@@ -44,11 +45,12 @@ struct Anchor
     bool mapped; ///< whether the two ends are still mapped
 };
 
+/// What a step of a drag comes to: where the handle is drawn, its value, and whether the ends are still mapped.
 struct Mapped
 {
-    double display;
-    double value;
-    bool mapped;
+    double display; ///< where the handle is drawn
+    double value; ///< its true place
+    bool mapped; ///< whether the two ends are still mapped
 };
 
 /// From the place where the handle is drawn to its value. A handle that was pushed aside starts with the two

@@ -32,7 +32,7 @@ ZELKOV_WIDGETS_EXPORT QPointF position(
 ZELKOV_WIDGETS_EXPORT QPointF positionInMotion(const QRectF& bar, const QPointF& origin, const QSize& size,
     const QSize& draggedSize, bool current, double display, Qt::Orientation orientation);
 
-/// To the nearest whole pixel, and toward 0. Points that no widget can have are taken to where one can be.
+// To the nearest whole pixel, and toward 0. Points that no widget can have are taken to where one can be.
 ZELKOV_WIDGETS_EXPORT QPoint rounded(const QPointF& point);
 ZELKOV_WIDGETS_EXPORT QPoint truncated(const QPointF& point);
 

@@ -12,6 +12,7 @@ namespace vx
 /// where it is drawn, both from 0 to 1; a row is an array of handles that is sorted by the drawn place.
 namespace NubsieLayout
 {
+/// The two places of a handle, from 0 to 1.
 struct Place
 {
     double display; ///< where it is drawn
@@ -21,8 +22,8 @@ struct Place
 /// Indexes into a row, both included; empty if last is under first.
 struct Block
 {
-    int first;
-    int last;
+    int first; ///< index of the lowest handle
+    int last; ///< index of the highest handle
 };
 
 /// A handle's length in units of the scale, for a handle of @p size on a scale that is @p extent pixels long. A
@@ -41,8 +42,8 @@ ZELKOV_WIDGETS_EXPORT Block enqueue(Place* row, int count, int seed, double leng
 /// The handles that drifted home when one was taken out.
 struct Drift
 {
-    Block below;
-    Block above;
+    Block below; ///< handles under the one taken out
+    Block above; ///< handles over it
 };
 
 /// Takes the handle at @p index out: those that it pushed aside move toward their true values, the side that was

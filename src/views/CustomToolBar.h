@@ -29,6 +29,7 @@ class ZELKOV_WIDGETS_EXPORT CustomToolBar : public QToolBar
 public:
     /// \a draggable: by its body, with the left button, as \a toolBarId.
     CustomToolBar(const QString& title, QWidget* parent, bool draggable, const QString& toolBarId);
+    /// The same without a title.
     CustomToolBar(QWidget* parent, bool draggable, const QString& toolBarId);
     ~CustomToolBar() override;
 
@@ -37,6 +38,7 @@ Q_SIGNALS:
     void actionDropped(QToolBar* toolBar, QString actionID, QAction* before);
     /// "Remove Item" was chosen in the context menu of the action, which is still there.
     void actionRemoved(QToolBar* toolBar, QAction* action);
+    /// A tool bar was dropped onto this one, or this one onto itself.
     void toolBarDropped(QString toolBarID);
 
 protected:

@@ -41,6 +41,7 @@ public:
     FadeStripeView(EPositions position, QWidget* contents, QWidget* parent);
     ~FadeStripeView() override;
 
+    /// The time line on the bar that moves; without a handle at first.
     vx::MultiNubsieSlider* slider() const;
 
     /// Height of one row of contents. Sets the heights to snap to: 15, then 30 more than one, two ... rows.
@@ -66,6 +67,7 @@ public:
 
     /// Sources whose drags are refused whatever they carry. Not owned and not watched; null is never ignored.
     void setIgnoredSources(const QList<QObject*>& sources);
+    // One more of them, and one less.
     void addIgnoredSource(QObject* source);
     void removeIgnoredSource(QObject* source);
     QList<QObject*> ignoredSources() const;
@@ -94,9 +96,11 @@ Q_SIGNALS:
     void footerPressed(float relPos);
     /// Released where it was pressed, on an open panel and not on the handle.
     void headerReleased(float relpos);
+    /// Likewise.
     void footerReleased(float relPos);
     /// The same on a closed panel.
     void headerReleasedFadedOut();
+    /// Likewise.
     void footerReleasedFadedOut();
     /// The height of the panel and its edge, whatever the names say.
     void heightChanged(int rows, int pos);
@@ -108,8 +112,11 @@ Q_SIGNALS:
     void dragAccepted(QPointer<QObject> source, const QMimeData& mimeData, int pos);
 
 protected:
+    /// Builds the bars and puts the contents between them; called by the constructor.
     void init(QWidget* contents);
+    /// Puts handle and time line onto a bar.
     void addGrab(QWidget* bar);
+    /// Whether the drag has an accepted format and comes from no ignored source.
     bool isMimeTypeAccepted(QDropEvent* event);
 
     void mousePressEvent(QMouseEvent* event) override;

@@ -14,6 +14,7 @@ class QWidget;
 class ZELKOV_WIDGETS_EXPORT FadeStripeViewController
 {
 public:
+    /// Where a panel stands at its widget.
     enum EFadeStripePosition : int
     {
         efspTop = 0,
@@ -21,12 +22,14 @@ public:
         efspWestern = 3
     };
 
+    /// The one directory of the process.
     static FadeStripeViewController* getInstance();
 
     void setFadeStripe(FadeStripeView* stripe, QWidget* widget, EFadeStripePosition position);
     /// Null if there is none.
     FadeStripeView* getFadeStripe(QWidget* widget, EFadeStripePosition position) const;
 
+    // The same with the position in the name.
     void setTopFadeStripe(FadeStripeView* stripe, QWidget* widget);
     void setBottomFadeStripe(FadeStripeView* stripe, QWidget* widget);
     void setWesternFadeStripe(FadeStripeView* stripe, QWidget* widget);

@@ -41,6 +41,7 @@ class ZELKOV_WIDGETS_EXPORT FadeView : public QWidget
     Q_OBJECT
 
 public:
+    /// The edge that the panel stands at.
     enum EPositions : int
     {
         ePositionTop = 0,
@@ -48,8 +49,8 @@ public:
     };
     Q_ENUM(EPositions)
 
-    static constexpr int c_Duration = ::c_Duration;
-    static constexpr int c_Bordersize = ::c_Bordersize;
+    static constexpr int c_Duration = ::c_Duration; ///< of a movement, in milliseconds
+    static constexpr int c_Bordersize = ::c_Bordersize; ///< height of the strip, in pixels
 
     /// \a widget is for subclasses; this class makes no use of it. A new panel counts as open, though it has the
     /// height hint of the strip.
@@ -59,7 +60,9 @@ public:
     bool isActive() const;
     /// An inactive panel ignores fadein() and fadeout(). A running movement goes on.
     void setActive(bool active);
+    /// Whether the panel is open or about to open.
     bool isFadedIn() const;
+    /// Whether the panel has the full height, after an animated goFullscreen().
     bool isFullscreen() const;
     /// The height that the panel has, or is about to have.
     int getSizeHint() const;
@@ -69,15 +72,23 @@ public:
     /// Height of another panel at the same edge. The panel keeps this distance from its edge on top in a layout,
     /// and at the bottom outside one.
     void setNeighbourSize(int size);
+    /// The same as geometry(): nothing is taken off.
     QRect geometryOffsetFree() const;
 
 Q_SIGNALS:
+    /// The panel is open; followed by geometryChanged(). Not outside a layout without animation.
     void fadingInFinished(FadeView* view);
+    /// The panel is a strip; followed by geometryChanged(). Not outside a layout without animation.
     void fadingOutFinished(FadeView* view);
+    /// A movement that opens the panel begins; of a FadeStripeView also when a drag passes the height of the
+    /// strip.
     void fadingIn(FadeView* view);
+    /// The same for closing.
     void fadingOut(FadeView* view);
+    // The movement to the full height begins, and that back from it.
     void appearingFullscreen();
     void leavingFullscreen();
+    // The panel has the full height, and its former one again.
     void fullscreenAppeared();
     void fullscreenLeft();
     /// Vertical while the panel has the full height, horizontal again from when it has left it.
@@ -89,6 +100,7 @@ public Q_SLOTS:
     /// Takes note of the parent's size, or of a larger one, and puts the panel where it belongs. Hides the
     /// function of QWidget.
     void resize(int width = -1, int height = -1);
+    /// Emits geometryChanged().
     void emitGeometryChange();
     /// In a movement of the first way: takes over the height of a rectangle, if that is valid.
     void changeSize(const QVariant& value);
@@ -117,32 +129,34 @@ protected Q_SLOTS:
     void fullscreenExited();
 
 protected:
+    // The two ways of fadein() and fadeout(), outside a layout and in one.
     void fadeinIndependent(bool animated, bool force);
     void fadeinLayout(bool animated, bool force);
     void fadeoutIndependent(bool animated, bool force);
     void fadeoutLayout(bool animated, bool force);
+    /// Called by the constructor.
     void init(EPositions position, QWidget* widget);
 
     void showEvent(QShowEvent* event) override;
 
-    EPositions m_position;
-    bool m_partOfLayout = true;
-    bool m_fullscreen = false;
+    EPositions m_position; ///< the edge
+    bool m_partOfLayout = true; ///< see setFadeStripeAsPartOfLayout()
+    bool m_fullscreen = false; ///< see isFullscreen()
     bool m_fullscreenTransition = false; // stays on after a still goFullscreen()
-    int m_parentHeight = 0;
-    int m_parentWidth = 0;
-    int m_sizeHint = c_Bordersize;
+    int m_parentHeight = 0; ///< as of the last resize()
+    int m_parentWidth = 0; ///< as of the last resize()
+    int m_sizeHint = c_Bordersize; ///< see getSizeHint()
     int m_maximumHeight = QWIDGETSIZE_MAX; // in a layout
     int m_stripeMinimumHeight = 0; // of a dragged height
-    bool m_fadedIn = true;
-    int m_fadeInSize = 99;
-    int m_preFullscreenSize = 99;
-    int m_verticalOffset = 0;
+    bool m_fadedIn = true; ///< see isFadedIn()
+    int m_fadeInSize = 99; ///< what the next fadein() opens to
+    int m_preFullscreenSize = 99; ///< what exitFullscreen() goes back to
+    int m_verticalOffset = 0; ///< see setVerticalOffset()
     int m_layoutVerticalOffset = 0; // stored only
     int m_minimumSize = c_Bordersize; // of the opened height
-    int m_neighbourOffset = 0;
-    int m_neighbourSize = 0;
-    bool m_active = true;
+    int m_neighbourOffset = 0; ///< distance from the edge
+    int m_neighbourSize = 0; ///< see setNeighbourSize()
+    bool m_active = true; ///< see setActive()
 
 private:
     class Movement;

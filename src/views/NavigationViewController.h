@@ -45,8 +45,10 @@ public:
     QWidget* animatedWidget() const;
 
 Q_SIGNALS:
+    // Of the page that comes, before and after the change; null for an index out of range.
     void viewWillAppear(QWidget* widget, bool animated);
     void viewDidAppear(QWidget* widget, bool animated);
+    // Of the page that goes, likewise.
     void viewWillDisappear(QWidget* widget, bool animated);
     void viewDidDisappear(QWidget* widget, bool animated);
 

@@ -13,19 +13,21 @@ namespace vx
 /// the parent. Edges are the numbers of FadeView::EPositions.
 namespace PanelGeometry
 {
+// The edges.
 constexpr int c_Top = 0;
 constexpr int c_Bottom = 1;
 
 /// Height of the closed strip, and of each of the two bars of a stripe.
 constexpr int c_Strip = 15;
+/// Height of both bars of a stripe.
 constexpr int c_Bars = 2 * c_Strip;
 
 /// What a panel knows of its surroundings.
 struct Surroundings
 {
-    int edge = c_Top;
-    int parentWidth = 0;
-    int parentHeight = 0;
+    int edge = c_Top; ///< c_Top or c_Bottom
+    int parentWidth = 0; ///< in pixels
+    int parentHeight = 0; ///< in pixels
     int neighbourOffset = 0; ///< distance to a panel between this one and the edge
     int verticalOffset = 0; ///< further distance to the top edge
 };

@@ -17,14 +17,14 @@ class CoordinateSystem;
 /// The thinking of RubberBandWidget. Grips are the numbers of RubberBandWidget::Grip.
 namespace RubberBandGeometry
 {
-/// The sides, which corners add up, and the inside.
+// The sides, which corners add up, and the inside.
 constexpr int c_Left = 1;
 constexpr int c_Right = 4;
 constexpr int c_Top = 16;
 constexpr int c_Bottom = 64;
 constexpr int c_Inside = 34;
 
-/// Bits of the modes of gripAt().
+// Bits of the modes of gripAt().
 constexpr int c_EdgesMode = 1;
 constexpr int c_InsideMode = 2;
 
@@ -48,6 +48,7 @@ ZELKOV_WIDGETS_EXPORT int gripAt(const QRect& rect, const QPoint& point, int mar
 /// whether or not its last point repeats the first; fewer than three points enclose nothing.
 ZELKOV_WIDGETS_EXPORT int gripAt(const QPolygon& polygon, const QPoint& point);
 
+/// The cursor over a grip, and while it is dragged.
 ZELKOV_WIDGETS_EXPORT Qt::CursorShape cursorFor(int grip, bool dragging);
 
 /// Drags the grip by an offset in pixels. \a screen and \a geometry are the rectangle at the press, in pixels and

@@ -53,6 +53,7 @@ public:
     };
     Q_ENUM(Grip)
 
+    /// Without a geometry; \a coordinateSystem is not owned and may be null.
     explicit RubberBandWidget(vx::CoordinateSystem* coordinateSystem, QWidget* parent = nullptr);
     ~RubberBandWidget() override;
 
@@ -68,12 +69,14 @@ public:
     virtual void setContentsGeometry(const QRect& rect);
     /// Shown in the top left corner; an empty text hides the label.
     virtual void setLabel(const QString& text);
+    // Pen, colour and style of the frame.
     virtual void setFramePen(const QPen& pen);
     virtual void setFrameColor(const QColor& color);
     virtual void setFrameStyle(Qt::PenStyle style);
     /// In pixels; twice as wide while selected. Below 0 counts as 0, which is the thinnest line. The wider the
     /// frame, the wider the grips of the edges.
     virtual void setFrameWidth(int width);
+    /// Of the inside, with its alpha.
     virtual void setBackgroundColor(const QColor& color);
     /// From 0 (seen through) to 1 (opaque); sets the alpha of the background colour.
     virtual void setBackgroundTransparency(float transparency);
@@ -86,6 +89,7 @@ public:
     virtual void setCoordinateSystem(vx::CoordinateSystem* coordinateSystem);
 
 protected:
+    // What the band paints, in its own coordinates: the contents first, then the frame.
     virtual void drawFrame(QPainter* painter);
     virtual void drawContents(QPainter* painter);
 
@@ -105,24 +109,33 @@ protected Q_SLOTS:
     virtual void onClose();
 
 Q_SIGNALS:
+    // The pointer came over the band, and left it.
     void mouseEntered(vx::RubberBandWidget* band);
     void mouseLeft(vx::RubberBandWidget* band);
+    /// A press on a grip, before anything moves.
     void startDrag(vx::RubberBandWidget* band);
     /// The geometry has been changed by the pointer, or would have been.
     void dragging(vx::RubberBandWidget* band);
+    /// The release that ends the drag, moved or not.
     void endDrag(vx::RubberBandWidget* band);
+    // The band got the focus and has been raised, and lost it.
     void focused(vx::RubberBandWidget* band);
     void focusLost(vx::RubberBandWidget* band);
+    // select() has changed something.
     void selected(vx::RubberBandWidget* band);
     void selectionLost(vx::RubberBandWidget* band);
+    /// The close button was clicked; the band stays.
     void closeClicked(vx::RubberBandWidget* band);
 
 public:
+    /// The region in the application's units.
     QRectF applicationGeometry() const;
+    /// See select().
     bool isSelected() const;
     /// Whether an edge or corner is held, or merely under the pointer.
     bool isResizeDragging() const;
     QString label() const;
+    /// As it was set; twice as wide is drawn while selected.
     QPen framePen() const;
 
     /// The marked area in this widget's coordinates.
@@ -140,6 +153,7 @@ public:
     /// A polygon can only be gripped as a whole: gInside in it (odd-even rule) or on its outline, gNone elsewhere
     /// and for fewer than three points.
     static Grip findGrip(const QPolygon& polygon, const QPoint& point);
+    /// The cursor over a grip, and while it is dragged.
     static QCursor getCursor(Grip grip, bool dragging);
 
 protected:

@@ -23,6 +23,7 @@ public:
     explicit ZoomScrollArea(QWidget* parent = nullptr);
     ~ZoomScrollArea() override;
 
+    // The overlay bars, at the top and at the right.
     QScrollBar* horizontalNicerScrollBar() const;
     QScrollBar* verticalNicerScrollBar() const;
     /// Default on: the bars are shown as needed.

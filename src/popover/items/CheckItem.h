@@ -24,6 +24,7 @@ class ZELKOV_WIDGETS_EXPORT CheckItem : public Item
     Q_OBJECT
 
 public:
+    /// Starts in the state \a checked, without a signal.
     CheckItem(const QString& text, const QString& objectName, int id, bool checked, QFlags<EItemFlag> flags,
         QWidget* parent);
     ~CheckItem() override;
@@ -42,6 +43,7 @@ public:
     /// never performed.
     void setSecurityCheckStates(bool onChecking, bool onUnchecking);
 
+    /// The box; null when it has been deleted by someone else.
     QCheckBox* checkBox() const;
 
 Q_SIGNALS:

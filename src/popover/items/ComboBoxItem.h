@@ -22,6 +22,7 @@ class ZELKOV_WIDGETS_EXPORT ComboBoxItem : public Item
     Q_OBJECT
 
 public:
+    /// Starts with the first of \a entries, without a signal.
     ComboBoxItem(const QString& text, const QString& objectName, int id, const QStringList& entries,
         QFlags<EItemFlag> flags, QWidget* parent);
     ~ComboBoxItem() override;
@@ -45,8 +46,10 @@ public:
 
     /// Whether an entry can be chosen by the user. An index out of range does nothing.
     void enableItem(int index, bool enabled);
+    /// The same for the first entry with these user data.
     void enableItemByUserData(const QVariant& userData, bool enabled);
 
+    /// The box; null when it has been deleted by someone else.
     QComboBox* comboBox() const;
 
 protected:

@@ -32,8 +32,10 @@ class ControlHolder
     };
 
 public:
+    /// What a slot holds while the control emits.
     using Report = std::shared_ptr<Token>;
 
+    /// Owns \a control from now on; null is allowed.
     explicit ControlHolder(Control* control)
         : m_control(control)
         , m_token(std::make_shared<Token>())
@@ -55,7 +57,7 @@ public:
     ControlHolder(const ControlHolder&) = delete;
     ControlHolder& operator=(const ControlHolder&) = delete;
 
-    /// Null when somebody else has deleted it.
+    // Null when somebody else has deleted it.
     Control* get() const { return m_control.data(); }
     Control* operator->() const { return m_control.data(); }
     explicit operator bool() const { return !m_control.isNull(); }

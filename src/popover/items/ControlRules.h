@@ -33,6 +33,7 @@ constexpr int nextInRing(int state)
 {
     return (state + 1) % 3;
 }
+/// The step back.
 constexpr int previousInRing(int state)
 {
     return (state + 2) % 3;

@@ -21,6 +21,7 @@ class ZELKOV_WIDGETS_EXPORT DateTimeItem : public Item
     Q_OBJECT
 
 public:
+    /// Starts at \a dateTime, without a signal.
     DateTimeItem(const QString& text, const QDateTime& dateTime, Qt::TimeSpec timeSpec, const QString& displayFormat,
         const QString& objectName, int id, QFlags<EItemFlag> flags, QWidget* parent);
     ~DateTimeItem() override;
@@ -29,6 +30,7 @@ public:
     void setValue(const QVariant& value) override;
     QVariant value() override;
 
+    /// The edit; null when it has been deleted by someone else.
     QDateTimeEdit* dateTimeEdit() const;
 
 private Q_SLOTS:

@@ -37,9 +37,10 @@ public:
     QVariant value() override;
     QWidget* getFocusItem() override;
 
+    /// The edit; null when it has been deleted by someone else.
     QLineEdit* lineEdit() const;
 
-    /// Invalid at first, as the other.
+    // Invalid at first, as the other.
     QColor placeholderColor() const;
     void setPlaceholderColor(const QColor& color);
     QColor textColor() const;
@@ -48,7 +49,7 @@ public:
 protected:
     void mouseReleaseEvent(QMouseEvent* event) override;
 
-    ControlHolder<QLineEdit> m_lineEdit;
+    ControlHolder<QLineEdit> m_lineEdit; ///< owned
 
 private Q_SLOTS:
     void onEditingFinished();

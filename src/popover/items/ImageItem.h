@@ -24,6 +24,7 @@ class ZELKOV_WIDGETS_EXPORT ImageItem : public Item
     Q_OBJECT
 
 public:
+    /// Shows \a pixmap.
     ImageItem(const QString& objectName, int id, const QPixmap& pixmap, QWidget* parent);
     ~ImageItem() override;
 
@@ -32,6 +33,7 @@ public:
     /// The picture, or a null variant without one.
     QVariant value() override;
 
+    /// The label that shows the picture.
     vx::Label* label() const;
 
 protected:

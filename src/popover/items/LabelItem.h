@@ -21,6 +21,7 @@ class ZELKOV_WIDGETS_EXPORT LabelItem : public Item
     Q_OBJECT
 
 public:
+    /// The text goes to a label, \a additionalText to the element at the right end, if there is one.
     LabelItem(const QString& text, const QString& additionalText, const QString& objectName, int id,
         QFlags<EItemFlag> flags, QWidget* parent);
     ~LabelItem() override;
@@ -33,6 +34,7 @@ public:
 
     /// Makes the text bold, whatever the argument: odd on purpose, clients rely on it.
     void setBold(bool bold);
+    /// The label that shows the text.
     QLabel* label() const;
 
 protected:

@@ -30,6 +30,7 @@ public:
     QVariant value() override;
     QFlags<EItemPerformedFlag> getItemPerformedFlag(const QPoint& pos, Qt::MouseButton button) override;
 
+    /// The button; null when it has been deleted by someone else.
     vx::MultiStateCustomToolButton* multiStateItem() const;
 
 protected:

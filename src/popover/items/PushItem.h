@@ -19,6 +19,7 @@ class ZELKOV_WIDGETS_EXPORT PushItem : public Item
     Q_OBJECT
 
 public:
+    /// Texts, names and flags are those of Item.
     PushItem(const QString& text, const QString& additionalText, const QString& objectName, int id,
         QFlags<EItemFlag> flags, QWidget* parent);
     ~PushItem() override;

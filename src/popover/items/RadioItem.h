@@ -36,6 +36,7 @@ public:
     /// Sets button and elements. Emits layoutChanged().
     void setChecked(bool checked) override;
 
+    // The button, and its group; null when they have been deleted by someone else.
     QRadioButton* radioButton() const;
     QButtonGroup* buttonGroup() const;
 

@@ -20,6 +20,7 @@ class ZELKOV_WIDGETS_EXPORT SearchItem : public EditItem
     Q_OBJECT
 
 public:
+    /// \a text is that of the row; the field starts empty with \a placeholder.
     SearchItem(const QString& text, const QString& placeholder, const QString& objectName, int id,
         QFlags<EItemFlag> flags, QWidget* parent);
     ~SearchItem() override;

@@ -26,6 +26,7 @@ class ZELKOV_WIDGETS_EXPORT SliderItem : public Item
     Q_OBJECT
 
 public:
+    /// The slider starts without a handle.
     SliderItem(const QString& text, const QString& objectName, int id, QFlags<EItemFlag> flags, QWidget* parent);
     ~SliderItem() override;
 
@@ -37,6 +38,7 @@ public:
     void cancelAnimations() override;
     void onItemScrolled() override;
 
+    /// The slider; null when it has been deleted by someone else.
     MultiNubsieSlider* slider() const;
 
 protected:

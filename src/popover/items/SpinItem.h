@@ -30,6 +30,7 @@ public:
     /// The number.
     QVariant value() override;
 
+    /// The box; null when it has been deleted by someone else.
     QSpinBox* spinBox() const;
 
 protected:

@@ -40,11 +40,13 @@ public:
     /// On the disclosure icon: eipDisclosure and the button.
     QFlags<EItemPerformedFlag> getItemPerformedFlag(const QPoint& pos, Qt::MouseButton button) override;
 
+    /// The nested content; null when it has been destroyed.
     Container* container() const;
     /// Null when it has been destroyed; the submenu then does not open any more.
     Controller* controller() const;
 
 public Q_SLOTS:
+    /// Opens the nested popover, as a click does.
     void open();
 
 protected:

@@ -24,6 +24,7 @@ class ZELKOV_WIDGETS_EXPORT TristateCheckItem : public Item
     Q_OBJECT
 
 public:
+    /// Starts in \a state, 0 to 2, without a signal.
     TristateCheckItem(const QString& text, const QString& objectName, int id, bool tristate, int state,
         QFlags<EItemFlag> flags, QWidget* parent);
     ~TristateCheckItem() override;
@@ -45,6 +46,7 @@ public:
     void setTristate(bool tristate);
     bool isTristate() const;
 
+    /// The box; null when it has been deleted by someone else.
     QCheckBox* checkBox() const;
 
 Q_SIGNALS:

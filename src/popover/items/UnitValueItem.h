@@ -32,7 +32,7 @@ public:
     /// Sets radio button and elements. Emits layoutChanged().
     void setChecked(bool checked) override;
 
-    /// The number, then the unit; both have the object name "edit".
+    // The number, then the unit; both have the object name "edit".
     QSpinBox* valueItem() const;
     QComboBox* unitItem() const;
     /// Null without a group.

@@ -23,6 +23,7 @@ class ZELKOV_WIDGETS_EXPORT iOSCheckItem : public Item
     Q_OBJECT
 
 public:
+    /// Starts in the state \a checked, without a signal.
     iOSCheckItem(const QString& text, const QString& objectName, int id, bool checked, QFlags<EItemFlag> flags,
         QWidget* parent);
     ~iOSCheckItem() override;
@@ -36,6 +37,7 @@ public:
     void setChecked(bool checked) override;
     QFlags<EItemPerformedFlag> getItemPerformedFlag(const QPoint& pos, Qt::MouseButton button) override;
 
+    /// The switch; null when it has been deleted by someone else.
     iOSCheckBox* checkBox() const;
 
 Q_SIGNALS:
