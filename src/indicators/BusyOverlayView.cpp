@@ -19,6 +19,7 @@ BusyOverlayView::BusyOverlayView(QWidget* parent)
     , m_busySeconds(1)
 {
     setObjectName(QStringLiteral("BusyOverlayWidget"));
+    setAttribute(Qt::WA_StyledBackground); // the ground of a style sheet, and nothing else
     m_delayTimer.setSingleShot(true);
     m_delayTimer.setInterval(1000);
     m_secondsTimer.setSingleShot(false);
