@@ -192,5 +192,9 @@ void SettingsPopover::addHandle()
     slider->setDraggedSize(c_handle, QSize(22, 22));
     slider->setIcon(c_handle, knob);
     slider->setDrawTrack(true);
+    // It would stay in the window after the popover.
+    if (vx::Nubsie* const handle = slider->getNubsies().value(0)) {
+        connect(slider, &QObject::destroyed, handle, &QObject::deleteLater);
+    }
 }
 }
