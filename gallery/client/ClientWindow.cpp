@@ -42,6 +42,11 @@ ClientWindow::ClientWindow(QWidget* parent)
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(m_pages);
 
+    connect(m_pages, &vx::NavigationViewController::viewDidAppear, this, [this](QWidget* page) {
+        if (page == m_desk) {
+            m_desk->enter();
+        }
+    });
     const auto toPassword = [this] {
         m_desk->leave();
         m_password->clear();

@@ -14,9 +14,11 @@
 //                   settingsPopover: cameraSearchRow, viewsRow, deviceSideRow, stripesRow, labelsRow (allLabelsRow,
 //                   namesRow, timesRow, badgesRow), recordingsRow (pictureRow, recordingsNote, momentRow,
 //                   backToLiveRow), camerasRow (renameRow, siteRow, outageRow), accountRow (whoRow, shownNameRow,
-//                   stayRow, idleRow, newPasswordRow), languageRow (languageRow_en, languageRow_de, languageRow_fr),
+//                   idleSwitchRow, idleRow, newPasswordRow), languageRow (languageRow_en, languageRow_de, languageRow_fr),
 //                   themeRow (themeRow_light, themeRow_dark), customizeRow, logOutRow
-// The rows are children of the window that the client stands in. The panels name their own parts.
+// Rows in brackets stand in a popover of their own, which opens by the row in front of them. Rows are
+// children of the window that the client stands in, and a closed popover may still be there for a moment: take the row
+// that is visible. The panels name their own parts.
 #pragma once
 
 #include <QtWidgets/QWidget>

@@ -41,6 +41,8 @@ public:
     RecordStripes& stripes() { return *m_stripes; }
 
     void setViewCount(int count);
+    /// Gives the pictures the keyboard.
+    void enter();
     /// Ends what should not wait for the next user: popovers, the stick, marking.
     void leave();
 
@@ -64,6 +66,7 @@ private:
     void applyRole();
     void showUserText();
     void showThumbnails(bool on);
+    void makeRoom();
     void chooseCamera(int id);
     void showRecorded(quint64 microseconds);
     void showLive();
@@ -92,5 +95,6 @@ private:
     PopoverPlace* m_place;
     SettingsPopover* m_settingsPopover;
     QTimer m_idle;
+    QTimer m_room;
 };
 }

@@ -56,6 +56,7 @@ DeskBar::DeskBar(Session& session, QWidget* parent)
     m_user->setObjectName(QStringLiteral("userButton"));
     m_user->setElideMode(Qt::ElideRight);
     m_user->setMaximumWidth(c_userWidth);
+    m_user->setFocusPolicy(Qt::TabFocus);
     connect(m_settings, &QToolButton::clicked, this, [this] { Q_EMIT settingsWanted(m_settings); });
     connect(m_user, &QPushButton::clicked, this, [this] { Q_EMIT userWanted(m_user); });
 

@@ -54,8 +54,8 @@ enum SubmenuRowId
     IdOutage,
     IdWho,
     IdShownName,
-    IdNever,
     IdIdle,
+    IdIdleTime,
     IdPassword
 };
 }
@@ -236,29 +236,23 @@ void SettingsPopover::addAccount(Container* container)
 
     addLine(content);
     const int seconds = m_settings.values().idleSeconds;
-    auto* group = new QButtonGroup(content);
-    Item* const never = add(content,
-        new rows::RadioItem(tr("Stay logged in"), QStringLiteral("stayRow"), IdNever, seconds == 0, group, c_controls,
-            nullptr));
-    connect(never, &Item::itemPerformed, this, [this] { m_settings.set(&Settings::Values::idleSeconds, 0); });
-    auto* idle = new rows::UnitValueItem(
-        tr("Log out after"), {tr("s"), tr("min")}, QStringLiteral("idleRow"), group, IdIdle, c_controls, nullptr);
-    idle->valueItem()->setRange(1, 99);
-    idle->valueItem()->setValue(seconds == 0 ? 10 : seconds >= 60 ? seconds / 60 : seconds);
-    idle->unitItem()->setCurrentIndex(seconds == 0 || seconds >= 60 ? 1 : 0);
-    if (seconds == 0) {
-        never->setChecked(true);
-    } else {
-        idle->setChecked(true);
-    }
+    auto* idle = new rows::iOSCheckItem(
+        tr("Log out when idle"), QStringLiteral("idleSwitchRow"), IdIdle, seconds > 0, c_controls, nullptr);
     add(content, idle);
-    const auto take = [this, idle] {
-        const int number = idle->valueItem()->value();
-        m_settings.set(&Settings::Values::idleSeconds, idle->unitItem()->currentIndex() == 1 ? number * 60 : number);
+    auto* after = new rows::UnitValueItem(
+        tr("After"), {tr("s"), tr("min")}, QStringLiteral("idleRow"), nullptr, IdIdleTime, c_controls, nullptr);
+    after->valueItem()->setRange(1, 99);
+    after->valueItem()->setValue(seconds == 0 ? 10 : seconds >= 60 ? seconds / 60 : seconds);
+    after->unitItem()->setCurrentIndex(seconds == 0 || seconds >= 60 ? 1 : 0);
+    add(content, after);
+    const auto take = [this, idle, after] {
+        const int number = after->valueItem()->value();
+        const int time = after->unitItem()->currentIndex() == 1 ? number * 60 : number;
+        m_settings.set(&Settings::Values::idleSeconds, idle->value().toBool() ? time : 0);
     };
-    connect(idle, &Item::itemPerformed, this, take);
-    connect(idle->valueItem(), QOverload<int>::of(&QSpinBox::valueChanged), this, take);
-    connect(idle->unitItem(), QOverload<int>::of(&QComboBox::currentIndexChanged), this, take);
+    connect(idle, &Item::itemPerformed, after, take);
+    connect(after->valueItem(), QOverload<int>::of(&QSpinBox::valueChanged), this, take);
+    connect(after->unitItem(), QOverload<int>::of(&QComboBox::currentIndexChanged), this, take);
 
     addLine(content);
     Item* const password = add(content,

@@ -732,10 +732,11 @@ void TestClientDesk::anIdleUserIsLoggedOut()
     c.openSubmenu("accountRow", "accountRowRows");
     auto* number = c.widget("idleRow")->findChild<QSpinBox*>();
     auto* unit = c.widget("idleRow")->findChild<QComboBox*>();
-    QVERIFY(c.find<Item>("stayRow")->value().toBool());
-    number->setValue(1);
+    QVERIFY(!c.find<Item>("idleSwitchRow")->value().toBool());
     unit->setCurrentIndex(0);
-    QTRY_COMPARE_WITH_TIMEOUT(c.session().role(), Session::Role::None, 4000);
+    number->setValue(2);
+    c.clickRow("idleSwitchRow");
+    QTRY_COMPARE_WITH_TIMEOUT(c.session().role(), Session::Role::None, 6000);
     QTRY_COMPARE(c.pages()->currentWidget(), c.widget("loginPanel"));
     QVERIFY(c.openPopovers().isEmpty());
 }
