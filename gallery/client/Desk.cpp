@@ -20,7 +20,6 @@
 #include "popover/items/PushItem.h"
 #include "popover/items/RadioItem.h"
 #include "popover/items/Separator.h"
-#include "views/FadeStripeView.h"
 #include "views/NavigationViewController.h"
 
 #include <QtCore/QDateTime>
@@ -43,9 +42,6 @@ namespace rows = vx::PopoverWidget;
 
 constexpr int c_slideMs = 260;
 constexpr int c_menuWidth = 220;
-// The pictures follow the panels over them when these have come to rest.
-constexpr int c_restMs = 120;
-constexpr int c_barHeight = 16;
 // From live pictures the recordings begin this far back.
 constexpr int c_backMs = 60 * 1000;
 }
@@ -131,11 +127,6 @@ Desk::Desk(Fleet& fleet, Session& session, QWidget* parent)
     layout->addWidget(m_splitter, 1);
     layout->addWidget(line);
 
-    m_room.setSingleShot(true);
-    m_room.setInterval(c_restMs);
-    connect(&m_room, &QTimer::timeout, this, &Desk::makeRoom);
-    m_stripes->eventStripe()->installEventFilter(this);
-    m_stripes->timeStripe()->installEventFilter(this);
     m_idle.setSingleShot(true);
     connect(&m_idle, &QTimer::timeout, this, &Desk::logOutWanted);
     connectBar();
@@ -270,28 +261,9 @@ void Desk::leave()
     m_idle.stop();
 }
 
-// The events come and go over the pictures, but the time line stays: no view is to lie below it.
-void Desk::makeRoom()
-{
-    const QWidget* const top = m_stripes->eventStripe();
-    const QWidget* const bottom = m_stripes->timeStripe();
-    const int height = m_area->height();
-    const int above = top->isVisible() ? qMin(top->geometry().bottom() + 1, c_barHeight) : 0;
-    const int below = bottom->isVisible() ? qBound(0, height - bottom->geometry().top(), height / 2) : 0;
-    m_area->layout()->setContentsMargins(0, above, 0, below);
-}
-
 bool Desk::eventFilter(QObject* watched, QEvent* event)
 {
     switch (event->type()) {
-    case QEvent::Resize:
-    case QEvent::Move:
-    case QEvent::Show:
-    case QEvent::Hide:
-        if (watched == m_stripes->eventStripe() || watched == m_stripes->timeStripe()) {
-            m_room.start();
-        }
-        break;
     case QEvent::MouseButtonPress:
     case QEvent::MouseMove:
     case QEvent::KeyPress:

@@ -66,7 +66,6 @@ private:
     void applyRole();
     void showUserText();
     void showThumbnails(bool on);
-    void makeRoom();
     void chooseCamera(int id);
     void showRecorded(quint64 microseconds);
     void showLive();
@@ -95,6 +94,5 @@ private:
     PopoverPlace* m_place;
     SettingsPopover* m_settingsPopover;
     QTimer m_idle;
-    QTimer m_room;
 };
 }

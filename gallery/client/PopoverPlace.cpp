@@ -5,6 +5,8 @@
 #include "popover/Container.h"
 #include "popover/Manager.h"
 
+#include <QtWidgets/QApplication>
+
 namespace client
 {
 using vx::PopoverWidget::Balloon;
@@ -33,9 +35,16 @@ Controller* PopoverPlace::begin(QWidget* target, const QString& title, const QSt
         return nullptr;
     }
     m_target = target;
+    m_focus = QApplication::focusWidget();
     m_controller = Manager::instance()->createController(Manager::instance()->getUniquePopoverID(), false, false,
         m_owner, target, title, objectName, Balloon::EArrowDirections(Balloon::eadTop), QSizeF(),
         Balloon::ESizeConstraints());
+    // Qt would give the keyboard to whatever comes next to the popover.
+    connect(m_controller.data(), &Controller::balloonClosed, this, [this] {
+        if (m_focus && m_owner->isAncestorOf(m_focus) && m_focus->isVisible()) {
+            m_focus->setFocus();
+        }
+    });
     return m_controller;
 }
 

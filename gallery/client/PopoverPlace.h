@@ -33,6 +33,7 @@ public:
 private:
     QWidget* m_owner;
     QPointer<QWidget> m_target;
+    QPointer<QWidget> m_focus; // before the popover
     QPointer<vx::PopoverWidget::Controller> m_controller;
 };
 }

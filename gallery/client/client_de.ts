@@ -731,14 +731,6 @@
         <translation>Angezeigter Name</translation>
     </message>
     <message>
-        <source>Stay logged in</source>
-        <translation>Angemeldet bleiben</translation>
-    </message>
-    <message>
-        <source>Log out after</source>
-        <translation>Abmelden nach</translation>
-    </message>
-    <message>
         <source>s</source>
         <translation>s</translation>
     </message>
@@ -749,6 +741,14 @@
     <message>
         <source>New password...</source>
         <translation>Neues Passwort ...</translation>
+    </message>
+    <message>
+        <source>Log out when idle</source>
+        <translation>Bei Untätigkeit abmelden</translation>
+    </message>
+    <message>
+        <source>After</source>
+        <translation>Nach</translation>
     </message>
 </context>
 <context>

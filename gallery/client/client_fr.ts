@@ -731,14 +731,6 @@
         <translation>Nom affiché</translation>
     </message>
     <message>
-        <source>Stay logged in</source>
-        <translation>Rester connecté</translation>
-    </message>
-    <message>
-        <source>Log out after</source>
-        <translation>Se déconnecter après</translation>
-    </message>
-    <message>
         <source>s</source>
         <translation>s</translation>
     </message>
@@ -749,6 +741,14 @@
     <message>
         <source>New password...</source>
         <translation>Nouveau mot de passe...</translation>
+    </message>
+    <message>
+        <source>Log out when idle</source>
+        <translation>Déconnecter si inactif</translation>
+    </message>
+    <message>
+        <source>After</source>
+        <translation>Après</translation>
     </message>
 </context>
 <context>

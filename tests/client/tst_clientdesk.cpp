@@ -117,7 +117,7 @@ struct Client
             QTest::qFail(qPrintable(QStringLiteral("not to be seen: ") + QLatin1String(name)), __FILE__, __LINE__);
             return;
         }
-        clickAt(target, QPoint(70, target->height() / 2));
+        clickAt(target, QPoint(120, target->height() / 2));
     }
     void type(const char* field, const QString& text)
     {
@@ -646,6 +646,11 @@ void TestClientDesk::theSearchRowGoesToACamera()
     QTest::keyClicks(search, QStringLiteral("roof 8"));
     QCOMPARE(c.client->fleet().camera(c.wall().currentCamera())->name, QStringLiteral("Roof 8"));
     QVERIFY(c.status().startsWith(QStringLiteral("Roof 8")));
+    // The keyboard goes back to the pictures.
+    QVERIFY(search->hasFocus());
+    c.clickAt(&c.window, QPoint(8, c.window.height() - 8));
+    QTRY_VERIFY(c.openPopovers().isEmpty());
+    QVERIFY(c.wall().hasFocus());
 }
 
 void TestClientDesk::theSiteIsSetBack()
