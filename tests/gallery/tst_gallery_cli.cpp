@@ -281,6 +281,9 @@ void TestGalleryCli::picturesNamedInASheetExist()
     while (it.hasNext()) {
         const QString file = it.next().captured(1);
         QVERIFY2(!QImage(file).isNull(), qPrintable(file));
+        if (file.contains(QLatin1String("/overlays/"))) {
+            continue; // drawn large, and always made smaller
+        }
         QString twice = file;
         twice.replace(QLatin1String(".png"), QLatin1String("@2x.png"));
         QCOMPARE(QImage(twice).size(), QImage(file).size() * 2);
