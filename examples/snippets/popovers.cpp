@@ -54,7 +54,6 @@ public:
     void turned(int value) { m_balloon.updateBalloon(value, 0, 100); }
 
 private:
-    vx::PopoverWidget::Manager* m_manager = (vx::PopoverWidget::Manager::init(1000), nullptr); // once, for all
     vx::PopoverBalloonWidget m_balloon{this, QString(), 40, tr("Zoom")};
 };
 //! [value]
@@ -121,6 +120,7 @@ namespace snippets
 {
 void popovers()
 {
+    vx::PopoverWidget::Manager::init(1000); // values in balloons need it
     snippets_popovers::Client client;
     client.resize(600, 400);
     auto* button = new QPushButton(&client);
