@@ -180,6 +180,7 @@ void GalleryWindow::rebuild()
     }
     m_page = nullptr;
     setCentralWidget(all);
+    all->lower(); // popovers and the handles of time lines are children of the window too, and stay above
     showPage(m_index);
     if (focus) {
         focus->setFocus();
