@@ -97,7 +97,9 @@ ExportPopover::ExportPopover(const Fleet& fleet, int camera, qint64 begin, qint6
 ExportPopover::~ExportPopover()
 {
     delete m_handle.data();
-    delete m_controller.data();
+    if (m_controller) {
+        m_controller->dismiss(false, true); // which ends ask()
+    }
 }
 
 QString ExportPopover::cameraName() const

@@ -84,7 +84,9 @@ RecordTimeLine::RecordTimeLine(Fleet& fleet, QWidget* parent)
 
 RecordTimeLine::~RecordTimeLine()
 {
-    delete m_popover.data(); // it stands in the window and would ask on
+    if (m_popover) {
+        m_popover->dismiss(false, true); // it stands in the window and would ask on
+    }
 }
 
 void RecordTimeLine::setLive()

@@ -224,6 +224,8 @@ private Q_SLOTS:
     void theAreaMayGoWhileAnExportRuns();
     void theAreaMayGoWhileThePopoverAsks();
     void theStripesMayGoInASlotOfTheirs();
+    void theAreaMayGoWhenTheExportIsOver();
+    void theAreaMayGoWhileAMomentIsTyped();
     void handlesDoNotLieOverTheCardOfAnExport();
 
     // Run time
@@ -876,7 +878,7 @@ void TestRecordStripes::theAreaMayGoWhileThePopoverAsks()
     whenOpen(scene, [&] { delete scene.area.data(); });
     scene.stripes->runExport(scene.bar);
     QVERIFY(!scene.stripes);
-    QVERIFY(!scene.popover());
+    QTRY_VERIFY(!scene.popover());
     QTRY_VERIFY(scene.window->findChildren<vx::Nubsie*>().isEmpty());
 
     Scene second;
@@ -921,6 +923,49 @@ void TestRecordStripes::theStripesMayGoInASlotOfTheirs()
         }
         pointer.release();
         QVERIFY(!scene.stripes);
+    }
+}
+
+void TestRecordStripes::theAreaMayGoWhenTheExportIsOver()
+{
+    Scene scene;
+    QObject::connect(scene.stripes, &RecordStripes::exportFinished, &scene.session, [&] { delete scene.area.data(); });
+    whenOpen(scene, [&] {
+        Pointer pointer(scene.window.get());
+        pointer.click(scene.middleOf(scene.row("exportAccept")));
+    });
+    scene.stripes->runExport(scene.bar);
+    QTRY_VERIFY_WITH_TIMEOUT(!scene.stripes, 10000);
+
+    Scene second;
+    QObject::connect(
+        second.stripes, &RecordStripes::exportFinished, &second.session, [&] { delete second.area.data(); });
+    whenOpen(second, [&] {
+        Pointer pointer(second.window.get());
+        pointer.click(second.middleOf(second.row("exportCancel")));
+    });
+    second.stripes->runExport(second.bar);
+    QVERIFY(!second.stripes);
+}
+
+void TestRecordStripes::theAreaMayGoWhileAMomentIsTyped()
+{
+    for (const bool wholeWindow : {false, true}) {
+        Scene scene;
+        QTRY_COMPARE(scene.seenHandles(), 3);
+        scene.stripes->timeLine()->askForMoment();
+        QPointer<Controller> popover = scene.find<Controller>("momentPopover");
+        QVERIFY(popover);
+        if (wholeWindow) {
+            scene.window.reset();
+        } else {
+            QObject::connect(
+                scene.stripes, &RecordStripes::timeChosen, &scene.session, [&] { delete scene.area.data(); });
+            auto* const edit = popover->findChild<QDateTimeEdit*>();
+            edit->setDateTime(edit->dateTime().addSecs(-60));
+        }
+        QTRY_VERIFY(!scene.stripes);
+        QTRY_VERIFY(!popover);
     }
 }
 
