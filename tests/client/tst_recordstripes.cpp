@@ -1110,13 +1110,22 @@ void TestRecordStripes::aNewThemeComesAtOnce()
         Scene scene;
         QTRY_COMPARE(scene.seenHandles(), 3);
         vx::Nubsie* const handle = scene.track()->positionSlider()->getNubsies().constFirst();
+        const auto knob = [handle] {
+            const QImage icon = handle->icon().toImage();
+            return icon.pixelColor(icon.rect().center());
+        };
+        QPalette green = scene.window->palette();
+        green.setColor(QPalette::Highlight, Qt::darkGreen);
+        scene.window->setPalette(green);
+        QCOMPARE(knob(), QColor(Qt::darkGreen));
+        scene.window->setPalette(QPalette());
+
         QVector<QColor> knobs;
         QVector<QColor> grounds;
         for (const zelkov::theme::Name name : {zelkov::theme::Name::Light, zelkov::theme::Name::Dark}) {
             zelkov::theme::apply(*qApp, name);
             QCoreApplication::processEvents();
-            const QImage icon = handle->icon().toImage();
-            knobs << icon.pixelColor(icon.rect().center());
+            knobs << knob();
             const QImage line = scene.stripes->timeLine()->grab().toImage();
             grounds << line.pixelColor(3, line.height() - 3);
             QCOMPARE(scene.seenHandles(), 3);
