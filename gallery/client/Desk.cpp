@@ -138,7 +138,11 @@ Desk::Desk(Fleet& fleet, Session& session, QWidget* parent)
     m_bar->setLive(m_wall->isLive());
 }
 
-Desk::~Desk() = default;
+Desk::~Desk()
+{
+    // Its rows refer to all that is below.
+    delete m_place;
+}
 
 void Desk::connectBar()
 {
@@ -324,6 +328,9 @@ void Desk::applyRole()
     if (m_session.isRightRefused(QStringLiteral("ptz"), true, false, false)) {
         m_bar->setSteering(false);
         m_ptz->hide();
+    }
+    if (m_session.role() == Session::Role::None) {
+        m_settings->set(&Settings::Values::shownName, QString()); // the next user has a name of his own
     }
     applySettings();
 }

@@ -24,7 +24,10 @@ PopoverPlace::PopoverPlace(QWidget* owner)
 
 PopoverPlace::~PopoverPlace()
 {
-    delete m_controller;
+    if (m_controller) {
+        disconnect(m_controller, nullptr, this, nullptr);
+        delete m_controller;
+    }
 }
 
 Controller* PopoverPlace::begin(QWidget* target, const QString& title, const QString& objectName)

@@ -727,6 +727,11 @@ void TestClientDesk::theShownNameStandsOnTheButton()
     QTest::keyClicks(field, QStringLiteral("Night shift"));
     QTest::keyClick(field, Qt::Key_Return);
     QCOMPARE(c.find<QPushButton>("userButton")->text(), QStringLiteral("Night shift"));
+    // It is not that of the next one.
+    c.client->logOut();
+    QTRY_COMPARE(c.pages()->currentWidget(), c.widget("loginPanel"));
+    c.logIn("user", "camera1!");
+    QCOMPARE(c.find<QPushButton>("userButton")->text(), QStringLiteral("user"));
 }
 
 void TestClientDesk::anIdleUserIsLoggedOut()
