@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Colours of the themes, and how they get into the sheet and the palette.
+// Where the sheets come from, and the palette that goes with them.
 #include "theme/Theme.h"
 
 #include <QtCore/QFile>
+#include <QtCore/QHash>
+#include <QtCore/QStringList>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QStyle>
 #include <QtWidgets/QStyleFactory>
@@ -12,6 +14,7 @@ static void initThemeResource()
 {
     Q_INIT_RESOURCE(theme);
     Q_INIT_RESOURCE(timeline);
+    Q_INIT_RESOURCE(sheets);
 }
 
 namespace zelkov
@@ -20,35 +23,30 @@ namespace theme
 {
 namespace
 {
-struct Color
-{
-    const char* word;
-    const char* light;
-    const char* dark;
-};
+using Colors = QHash<QString, QColor>;
 
-const Color s_colors[] = {
-    {"window", "#eef0f4", "#12161d"},     {"surface", "#ffffff", "#1b212b"},
-    {"raised", "#f8f9fb", "#232b37"},     {"border", "#d3d8e1", "#333d4c"},
-    {"strong", "#aab3c2", "#4c596d"},     {"text", "#18202c", "#e7ebf2"},
-    {"faint", "#5d6a7e", "#98a5b9"},      {"disabled", "#a3adbb", "#5d697b"},
-    {"accent", "#1f66d6", "#5b9bff"},     {"accenthover", "#1857bb", "#7aaeff"},
-    {"accenttext", "#ffffff", "#0d1524"}, {"hover", "#e6eaf1", "#2a3341"},
-    {"pressed", "#d9dfe9", "#354051"},    {"selection", "#dce8fc", "#23395c"},
-    {"selected", "#123f8c", "#cfe1ff"},   {"tip", "#232b37", "#e7ebf2"},
-    {"tiptext", "#f3f5f8", "#18202c"},    {"bad", "#c8373c", "#ff7b7b"},
-    {"badground", "#fdf0f0", "#3a2228"},  {"good", "#1f8a50", "#57c98a"},
-    {"goodground", "#eefaf3", "#1c3329"},
-};
+Colors readColors(int column)
+{
+    Colors result;
+    QFile file(QStringLiteral(":/zelkov/theme/colors.txt"));
+    if (file.open(QIODevice::ReadOnly)) {
+        const QStringList lines = QString::fromUtf8(file.readAll()).split(QLatin1Char('\n'));
+        for (const QString& line : lines) {
+            const QStringList words = line.simplified().split(QLatin1Char(' '));
+            if (words.size() == 3 && !line.startsWith(QLatin1Char('#'))) {
+                result.insert(words.at(0), QColor(words.at(column)));
+            }
+        }
+    }
+    return result;
+}
 
 QColor color(Name name, const char* word)
 {
-    for (const Color& entry : s_colors) {
-        if (qstrcmp(entry.word, word) == 0) {
-            return QColor(QLatin1String(name == Name::Dark ? entry.dark : entry.light));
-        }
-    }
-    return {};
+    initThemeResource();
+    static const Colors light = readColors(1);
+    static const Colors dark = readColors(2);
+    return (name == Name::Dark ? dark : light).value(QLatin1String(word));
 }
 }
 
@@ -59,18 +57,9 @@ QString styleSheet(Name name)
     if (name == Name::None) {
         return {};
     }
-    QFile file(QStringLiteral(":/zelkov/theme/theme.qss"));
-    if (!file.open(QIODevice::ReadOnly)) {
-        return {};
-    }
-    QString sheet = QString::fromUtf8(file.readAll());
-    for (const Color& entry : s_colors) {
-        sheet.replace(QLatin1Char('@') + QLatin1String(entry.word) + QLatin1Char('@'),
-                      QLatin1String(name == Name::Dark ? entry.dark : entry.light));
-    }
-    sheet.replace(QLatin1String("@pictures@"),
-                  QLatin1String(":/zelkov/theme/pictures/") + QLatin1String(name == Name::Dark ? "dark" : "light"));
-    return sheet;
+    QFile file(name == Name::Dark ? QStringLiteral(":/zelkov/theme/dark.qss")
+                                  : QStringLiteral(":/zelkov/theme/light.qss"));
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
 }
 
 QPalette palette(Name name)

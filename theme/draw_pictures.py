@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Draws the pictures of popovers, time line, switch and overlays anew, in pictures/: run it after a change, commit."""
+"""Draws the pictures of popovers, dial, stick, time line, switch and overlays anew, in pictures/: run it after a change, commit."""
 import math
 import os
 import sys
@@ -8,7 +8,7 @@ import sys
 HERE = os.path.dirname(os.path.abspath(__file__))
 sys.path.insert(0, os.path.join(HERE, "..", "src", "resources"))
 sys.dont_write_bytecode = True
-from draw_pictures import RGBA, box, circle, fall, line, plain, polygon, render, write  # noqa: E402
+from draw_pictures import RGBA, box, circle, fall, line, plain, polygon, render, ring, write  # noqa: E402
 
 SIZE = 64
 FLAGS = {"red": ((240, 92, 88), (206, 44, 49)), "green": ((70, 196, 120), (33, 140, 80)),
@@ -121,8 +121,54 @@ def overlays():
         (circle(47, 76, 4), plain(40, 30, 0))]))
 
 
+# Dial, stick and handle: strong lines, faces from top to bottom, text, accent, bad
+LOOKS = {"light": ((150, 160, 176), ((255, 255, 255), (230, 234, 241)), (31, 102, 214), (200, 55, 60), (255, 255, 255)),
+         "dark": ((92, 106, 128), ((58, 69, 86), (38, 47, 60)), (91, 155, 255), (255, 123, 123), (27, 33, 43))}
+
+
+def around(cx, cy, radius, degrees):
+    return cx + radius * math.cos(math.radians(degrees)), cy + radius * math.sin(math.radians(degrees))
+
+
+def dial_plate(strong, n=216):
+    """From the lower left over the top to the lower right, as the dial turns."""
+    c = n / 2
+    return render(n, n, [
+        (line(*around(c, c, (0.455 if i % 10 else 0.43) * n, -240 + 15 * i), *around(c, c, 0.485 * n, -240 + 15 * i),
+              (0.011 if i % 10 else 0.016) * n), plain(*strong)) for i in range(21)])
+
+
+def dial_knob(strong, face, accent, n=160):
+    c, r = n / 2, 0.46 * n
+    layers = [(circle(c, c + 0.012 * n, r + 0.012 * n), plain(0, 0, 0, 50)), (circle(c, c, r), fall(*face, n)),
+              (ring(c, c, r, 0.014 * n), plain(*strong))]
+    return render(n, n, layers + ([(line(c, c - 0.84 * r, c, c - 0.45 * r, 0.06 * n), plain(*accent))] if accent else []))
+
+
+def stick_cross(strong, n=328):
+    c, r = n / 2, 0.4 * n
+    width = n / 130
+    return render(n, n, [(shape, plain(*strong)) for shape in (
+        ring(c, c, r, width), ring(c, c, r / 2, width), line(c - r, c, c + r, c, width), line(c, c - r, c, c + r, width))])
+
+
+def dot(colour, rim, n, inset=0.08):
+    c = n / 2
+    return render(n, n, [(circle(c, c, (0.5 - inset) * n), plain(*rim)), (circle(c, c, (0.5 - inset - 0.09) * n), plain(*colour))])
+
+
+def controls():
+    for theme, (strong, face, accent, bad, rim) in LOOKS.items():
+        for name, rows in (("dial-plate", dial_plate(strong)), ("dial-knob", dial_knob(strong, face, accent)),
+                           ("dial-disc", dial_knob(strong, face, None)), ("dial-dot", dot(accent, rim, 14, 0.02)),
+                           ("stick-cross", stick_cross(strong)), ("stick-point", dot(accent, rim, 66)),
+                           ("playhead", dot(accent, rim, 72)), ("playhead-off", dot(bad, rim, 72))):
+            write(os.path.join(HERE, "pictures", theme, name + ".png"), RGBA, rows)
+
+
 def main():
     popovers()
+    controls()
     overlays()
     write(os.path.join(HERE, "pictures", "switch", "btn_schalter.png"), RGBA, switch())
     folder = os.path.join(HERE, "pictures", "time-line")

@@ -54,7 +54,7 @@ QVector<Line> linesOfPage(const QString& word)
             head = cells.value(0);
         } else if (head == word && !line.startsWith(QLatin1String("|---"))) {
             const QString code = firstCode(cells.value(0));
-            result << Line {head == QLatin1String("Property")
+            result << Line {head == QLatin1String("Property") || head == QLatin1String("State property")
                     ? selector + QLatin1String(" { qproperty-") + code + QLatin1String(" }")
                     : code,
                 cells, i + 1};

@@ -90,7 +90,8 @@ QStringList keysOfTable()
 
 QStringList documented()
 {
-    return styling::keysOfPage(QStringLiteral("Selector")) + styling::keysOfPage(QStringLiteral("Property"));
+    return styling::keysOfPage(QStringLiteral("Selector")) + styling::keysOfPage(QStringLiteral("Property"))
+        + styling::keysOfPage(QStringLiteral("State property"));
 }
 
 /// Those of the first list that the second lacks.
@@ -242,7 +243,8 @@ void TestStyling::noRowIsToldTwice()
 void TestStyling::thePageTellsTheDefaults()
 {
     QHash<QString, QString> told;
-    for (const Line& line : styling::linesOfPage(QStringLiteral("Property"))) {
+    for (const Line& line : styling::linesOfPage(QStringLiteral("Property"))
+            + styling::linesOfPage(QStringLiteral("State property"))) {
         told.insert(line.key, QString(line.cells.value(2)).remove(QLatin1Char('`')));
     }
     QStringList wrong;
@@ -319,7 +321,8 @@ void TestStyling::theNamesOnShowAreTold()
 void TestStyling::thePropertiesInTheHeadersAreTold()
 {
     QStringList told;
-    for (const QString& key : styling::keysOfPage(QStringLiteral("Property"))) {
+    for (const QString& key : styling::keysOfPage(QStringLiteral("Property"))
+            + styling::keysOfPage(QStringLiteral("State property"))) {
         told << QString(key).remove(QStringLiteral("{ qproperty-")).remove(QStringLiteral(" }"));
     }
     told += styling::keysOfPage(QStringLiteral("Beyond a sheet"));
