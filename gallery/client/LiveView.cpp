@@ -359,11 +359,7 @@ void LiveView::place()
     const bool hasDate = width() >= s_widthForDate;
     if (hasDate != m_hasDate) {
         m_hasDate = hasDate;
-        vx::DateTimeEdit* const edit = m_time->getDateTimeEit();
-        edit->setDisplayFormat(TimeUtils::getDateTimeFormat(hasDate, true));
-        // Without a date to show, Qt limits the edit to the day of its time.
-        edit->clearMinimumDateTime();
-        edit->clearMaximumDateTime();
+        writeDates();
     }
     const bool hasTime = m_showTime && m_frame != 0;
     m_time->showFrametime(hasTime, m_frame, qBound(14, height() / 9, 22), s_inset, true,
@@ -372,6 +368,16 @@ void LiveView::place()
     if (m_busy->isVisible()) {
         placeBusy();
     }
+}
+
+// As the language does it.
+void LiveView::writeDates()
+{
+    vx::DateTimeEdit* const edit = m_time->getDateTimeEit();
+    edit->setDisplayFormat(TimeUtils::getDateTimeFormat(m_hasDate, true));
+    // Without a date to show, Qt limits the edit to the day of its time.
+    edit->clearMinimumDateTime();
+    edit->clearMaximumDateTime();
 }
 
 void LiveView::resizeEvent(QResizeEvent*)
@@ -398,6 +404,8 @@ void LiveView::changeEvent(QEvent* event)
     QWidget::changeEvent(event);
     if (event->type() == QEvent::LanguageChange) {
         retranslate();
+        writeDates();
+        place();
     } else if (event->type() == QEvent::StyleChange || event->type() == QEvent::FontChange) {
         place();
         update();

@@ -94,6 +94,7 @@ private:
     void makeGestures();
     void retranslate();
     void place();
+    void writeDates();
     void placeBusy();
     void showConnection();
     void showBusy();

@@ -10,6 +10,7 @@
 #include "client/RecordStripes.h"
 #include "client/Session.h"
 #include "client/TimeTrack.h"
+#include "controls/DateTimeEdit.h"
 #include "popover/Controller.h"
 #include "popover/Item.h"
 #include "popover/Manager.h"
@@ -19,6 +20,7 @@
 #include "support/Pointer.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "ZelkovUtils/TimeUtils.h"
 
 #include <QtTest/QtTest>
 #include <QtWidgets/QAbstractItemView>
@@ -155,6 +157,7 @@ private Q_SLOTS:
     void theWholeStory();
     void aUserMayDoLess();
     void settingsSurviveThePopover();
+    void datesFollowTheLanguage();
     void twoLogInsInTurn();
     void theClientIsDeletedInTheMiddle_data();
     void theClientIsDeletedInTheMiddle();
@@ -343,6 +346,24 @@ void TestClient::settingsSurviveThePopover()
     QVERIFY(stage.settled("namesRow"));
     QCOMPARE(stage.seen<vx::PopoverWidget::Item>("namesRow")->value().toBool(), false);
     QVERIFY(closePopover(stage, "settingsPopover"));
+}
+
+void TestClient::datesFollowTheLanguage()
+{
+    ClientStage stage(s_size);
+    QVERIFY(enter(stage));
+    const auto format = [&] {
+        const int id = stage.wall().shownCameras().first();
+        return stage.wall().view(id)->findChild<vx::DateTimeEdit*>()->displayFormat();
+    };
+    const QString before = format();
+    QCOMPARE(before, TimeUtils::getDateTimeFormat(true, true));
+    QVERIFY(click(stage, "settingsButton"));
+    QVERIFY(click(stage, "languageRow"));
+    QVERIFY(click(stage, "languageRow_de"));
+    QTRY_COMPARE(stage.languages, QStringList(QStringLiteral("de")));
+    QVERIFY(TimeUtils::getDateTimeFormat(true, true) != before);
+    QTRY_COMPARE(format(), TimeUtils::getDateTimeFormat(true, true));
 }
 
 void TestClient::twoLogInsInTurn()
