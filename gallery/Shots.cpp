@@ -11,6 +11,7 @@
 #include "Hand.h"
 #include "Page.h"
 #include "PageList.h"
+#include "popover/Manager.h"
 
 namespace gallery
 {
@@ -49,6 +50,10 @@ void Shots::next()
         hand->wait(30);
         hand->play([this, hand, shot] {
             save(shot);
+            // What a page left open lies over the window, and would be in the next picture.
+            if (auto* const popovers = vx::PopoverWidget::Manager::instance()) {
+                popovers->dismissAll(&m_window, false, true);
+            }
             hand->deleteLater();
             QTimer::singleShot(0, this, &Shots::next);
         });
