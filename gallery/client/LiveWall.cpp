@@ -23,6 +23,7 @@ constexpr int s_frameMillis = 40;
 constexpr int s_settleMillis = 200;
 constexpr int s_gap = 2;
 constexpr int s_toolsWidth = 372;
+constexpr int s_leastWidth = 200; // of the views beside them
 constexpr double s_turnSpeed = 0.8; // pictures a second
 constexpr double s_zoomSpeed = 2.5; // factor a second
 }
@@ -166,7 +167,8 @@ void LiveWall::arrange()
     if (m_counts) {
         const int width = qMin(s_toolsWidth, wall.width());
         m_counting->setGeometry(wall.right() + 1 - width, wall.top(), width, wall.height());
-        wall.setRight(wall.right() - width - 4 * s_gap);
+        m_counting->raise(); // where both have no room it covers a part of the views
+        wall.setWidth(qMax(wall.width() - width - 4 * s_gap, qMin(wall.width(), s_leastWidth)));
     }
     for (int i = 0; i < m_views.size(); ++i) {
         LiveView* const each = m_views.at(i);

@@ -746,6 +746,9 @@ void TestLiveWall::theCountingLineIsDraggedInThePicture()
     QCOMPARE(line->end() - line->start(), along);
     QVERIFY(qMin(line->start().y(), line->end().y()) >= 0);
     QCOMPARE(form->startingPoint(), line->start());
+    host.wall.resize(300, 400); // the tools leave something of the views
+    QVERIFY(host.wall.view(0)->width() > 90);
+    QCOMPARE(line->size(), host.wall.view(0)->size());
     host.wall.setCounting(false);
     QVERIFY(!form->isVisible());
     QVERIFY(!host.wall.findChild<client::CountingLine*>());
