@@ -74,7 +74,7 @@ void CountingTools::workIn(QWidget* view, int camera)
         return;
     }
     if (!m_lines.contains(camera)) {
-        m_lines.insert(camera, {QPoint(480, 810), QPoint(1440, 720), QString(), tr("Outside"), tr("Inside")});
+        m_lines.insert(camera, {QPoint(480, 640), QPoint(1440, 560), QString(), tr("Outside"), tr("Inside")});
     }
     fillForm(m_lines.value(camera));
     m_line = new CountingLine(view);
