@@ -21,6 +21,8 @@ namespace client
 namespace
 {
 const int s_bars = 2 * c_Bordersize;
+const int s_openEvents = EventStripe::s_rowHeight + s_bars;
+const int s_openTimeLine = RecordTimeLine::s_height + s_bars;
 const int s_openShare = 3; // of the area's height for the time line, at most one part of so many
 }
 
@@ -62,7 +64,7 @@ void RecordStripes::makeStripes()
     m_bottom = new FadeStripeView(FadeView::ePositionBottom, m_timeLine, m_area);
     m_bottom->setObjectName(QStringLiteral("timeStripe"));
     m_bottom->setFadeStripeAsPartOfLayout(false);
-    m_bottom->setMaximumHeight(RecordTimeLine::s_height + s_bars); // there is one row
+    m_bottom->setMaximumHeight(s_openTimeLine); // there is one row
     m_bottom->setContentsHeight(RecordTimeLine::s_height);
     m_bottom->setStyleDefault();
     m_bottom->setRows(1);
@@ -71,6 +73,21 @@ void RecordStripes::makeStripes()
     connect(m_bottom, &FadeView::geometryChanged, this, &RecordStripes::follow);
     connect(m_bottom, &FadeView::fadingOut, this, &RecordStripes::reserve);
     connect(m_bottom, &FadeView::fadingInFinished, this, &RecordStripes::reserve);
+    // Where there is no room for both, the one that opens shuts the other.
+    connect(m_bottom, &FadeView::fadingIn, this, [this] {
+        if (!fitsBoth() && m_top->isFadedIn() && !m_eventsOnTop) {
+            m_top->fadeout();
+        }
+    });
+    connect(m_top, &FadeView::fadingIn, this, [this] {
+        if (!fitsBoth() && m_bottom->isFadedIn()) {
+            m_bottom->fadeout();
+        }
+    });
+    connect(m_bottom, &FadeView::fadingInFinished, this, &RecordStripes::share);
+    connect(m_bottom, &FadeView::fadingOutFinished, this, &RecordStripes::share);
+    connect(m_top, &FadeView::appearingFullscreen, this, [this] { stackEvents(true); });
+    connect(m_top, &FadeView::fullscreenLeft, this, [this] { stackEvents(false); });
     connect(m_events, &EventStripe::eventClicked, this, &RecordStripes::chooseEvent);
     connect(m_timeLine, &RecordTimeLine::momentChosen, this,
         [this](qint64 moment) { Q_EMIT timeChosen(quint64(moment) * 1000); });
@@ -119,6 +136,9 @@ void RecordStripes::chooseEvent(int camera, qint64 time)
 {
     const QPointer<RecordStripes> alive(this);
     m_timeLine->setMoment(time);
+    if (m_top->isFullscreen()) {
+        m_top->exitFullscreen(); // the pictures are to be seen
+    }
     Q_EMIT cameraChosen(camera);
     if (alive) {
         const qint64 now = QDateTime::currentMSecsSinceEpoch();
@@ -172,13 +192,43 @@ void RecordStripes::place()
         m_bottom->setFadeStripeAsPartOfLayout(false);
         m_bottom->setHidden(isHidden);
     }
-    m_top->setMaximumHeight(m_area->height());
+    if (!fitsBoth() && m_top->isFadedIn() && m_bottom->isFadedIn() && !m_eventsOnTop) {
+        m_top->fadeout();
+    }
     m_top->resize();
     m_bottom->resize();
+    share();
     if (m_run) {
         m_run->place();
     }
     reserve();
+    follow();
+}
+
+bool RecordStripes::fitsBoth() const
+{
+    return m_area->height() >= s_openEvents + s_openTimeLine;
+}
+
+// The bar of the upper panel must not get below the lower one: nobody could shut it again.
+void RecordStripes::share()
+{
+    if (!m_top || !m_bottom) {
+        return;
+    }
+    const int lower = m_bottom->isHidden() ? 0 : m_bottom->isFadedIn() ? s_openTimeLine : c_Bordersize;
+    const int room = qMax(c_Bordersize, m_area->height() - lower);
+    m_top->setMaximumHeight(room);
+    if (m_top->isFadedIn() && !m_eventsOnTop && m_top->height() > room && room >= s_openEvents) {
+        m_top->setSizeHint(room, true);
+    }
+}
+
+// At full height the upper panel covers the lower one, and with it what is above all in the window.
+void RecordStripes::stackEvents(bool onTop)
+{
+    m_eventsOnTop = onTop;
+    (onTop ? m_top : m_bottom)->raise();
     follow();
 }
 
@@ -188,10 +238,9 @@ void RecordStripes::reserve()
     if (!m_top || !m_bottom) {
         return;
     }
-    const int open = RecordTimeLine::s_height + s_bars;
-    const bool isOpen = m_bottom->isFadedIn() && open * s_openShare <= m_area->height();
+    const bool isOpen = m_bottom->isFadedIn() && s_openTimeLine * s_openShare <= m_area->height();
     const QMargins margins(0, m_top->isHidden() ? 0 : c_Bordersize, 0,
-        m_bottom->isHidden() ? 0 : isOpen ? open : c_Bordersize);
+        m_bottom->isHidden() ? 0 : isOpen ? s_openTimeLine : c_Bordersize);
     if (m_area->contentsMargins() != margins) {
         m_area->setContentsMargins(margins);
     }
@@ -203,7 +252,7 @@ void RecordStripes::follow()
         return;
     }
     // They would lie over the card of a running export where the area is too low for both.
-    const bool isCovered = m_run && m_run->geometry().intersects(m_bottom->geometry());
+    const bool isCovered = m_eventsOnTop || (m_run && m_run->geometry().intersects(m_bottom->geometry()));
     m_timeLine->track()->setHandlesVisible(!isCovered);
     m_timeLine->track()->follow();
 }

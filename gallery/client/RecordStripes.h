@@ -69,6 +69,9 @@ private:
     void place();
     void follow();
     void reserve();
+    void share();
+    bool fitsBoth() const;
+    void stackEvents(bool onTop);
     void followRights();
     void chooseEvent(int camera, qint64 time);
     void startRun(const QString& fileName);
@@ -85,6 +88,7 @@ private:
     QPointer<ExportRun> m_run;
     QVector<QPointer<QWidget>> m_watched;
     int m_areaTop = 0; // in its window
+    bool m_eventsOnTop = false; // while they take the full height
     int m_camera = -1;
 };
 }

@@ -210,6 +210,8 @@ private Q_SLOTS:
     void picturesKeepClearOfWhatRests();
     void handlesFollowWhatIsAroundTheArea();
     void theUpperPanelTakesTheFullHeightAndBack();
+    void theUpperPanelEndsAboveTheLowerOne();
+    void inALowAreaOnePanelShutsTheOther();
     void aRemovedCameraTakesItsEventsAlong();
 
     // Export
@@ -666,13 +668,79 @@ void TestRecordStripes::theUpperPanelTakesTheFullHeightAndBack()
     }
     QTRY_COMPARE_WITH_TIMEOUT(top->height(), scene.area->height(), 5000);
     QTRY_VERIFY(top->isFullscreen());
-    // The lower panel lies above it, with its handles.
-    QVERIFY(scene.area->childAt(scene.area->rect().bottomLeft() + QPoint(20, -60)) != nullptr);
-    QVERIFY(scene.stripes->timeStripe()->isAncestorOf(
-        scene.area->childAt(scene.area->rect().bottomLeft() + QPoint(20, -60))));
-    QCOMPARE(scene.seenHandles(), 3);
-    top->exitFullscreen();
+    // Over the lower panel, or its own bar could not be reached, and over the handles.
+    QCOMPARE(scene.seenHandles(), 0);
+    QVERIFY(top->isAncestorOf(scene.window->childAt(scene.grabOf(top))));
+    scene.window->resize(950, 650);
+    QTRY_COMPARE(top->height(), scene.area->height());
+    QCOMPARE(scene.seenHandles(), 0);
+    scene.clickGrab(top);
     QTRY_VERIFY_WITH_TIMEOUT(!top->isFullscreen() && top->height() < 200, 5000);
+    QTRY_COMPARE(scene.seenHandles(), 3);
+    QVERIFY(scene.stripes->timeStripe()->isAncestorOf(scene.window->childAt(scene.grabOf(scene.stripes->timeStripe()))));
+
+    // A click on an event leaves the full height, too.
+    top->goFullscreen();
+    QTRY_VERIFY_WITH_TIMEOUT(top->isFullscreen(), 5000);
+    auto* const events = top->findChild<client::EventStripe*>();
+    Pointer pointer(scene.window.get());
+    pointer.click(events->mapTo(scene.window.get(), events->rectOf(1).center()));
+    QTRY_VERIFY_WITH_TIMEOUT(!top->isFullscreen() && top->height() < 200, 5000);
+    QTRY_COMPARE(scene.seenHandles(), 3);
+}
+
+void TestRecordStripes::theUpperPanelEndsAboveTheLowerOne()
+{
+    Scene scene;
+    FadeStripeView* const top = scene.stripes->eventStripe();
+    FadeStripeView* const bottom = scene.stripes->timeStripe();
+    const auto gap = [&] { return bottom->geometry().top() - top->geometry().bottom() - 1; };
+    scene.clickGrab(top);
+    QTRY_VERIFY_WITH_TIMEOUT(top->height() > 130, 5000);
+    QTest::qWait(350);
+    const auto dragToTheEnd = [&] {
+        Pointer pointer(scene.window.get());
+        pointer.move(scene.inWindow(top).bottomLeft() + QPoint(40, -7));
+        pointer.press();
+        pointer.move(QPoint(40, 400));
+        pointer.move(QPoint(40, 590));
+        pointer.release();
+    };
+    dragToTheEnd();
+    QCOMPARE(gap(), 0);
+    // With the lower one shut there is more room, and less again when it opens.
+    scene.clickGrab(bottom);
+    QTRY_COMPARE_WITH_TIMEOUT(bottom->height(), c_Bordersize, 5000);
+    QTest::qWait(50);
+    dragToTheEnd();
+    QCOMPARE(gap(), 0);
+    scene.clickGrab(bottom);
+    QTRY_VERIFY_WITH_TIMEOUT(bottom->height() > 130, 5000);
+    QTRY_COMPARE(gap(), 0);
+}
+
+void TestRecordStripes::inALowAreaOnePanelShutsTheOther()
+{
+    Scene scene;
+    FadeStripeView* const top = scene.stripes->eventStripe();
+    FadeStripeView* const bottom = scene.stripes->timeStripe();
+    scene.window->resize(900, 300);
+    QCoreApplication::processEvents();
+    QVERIFY(bottom->isFadedIn());
+    scene.clickGrab(top);
+    QTRY_VERIFY_WITH_TIMEOUT(top->height() > 130 && bottom->height() == c_Bordersize, 5000);
+    QTRY_COMPARE(scene.seenHandles(), 0);
+    scene.clickGrab(bottom);
+    QTRY_VERIFY_WITH_TIMEOUT(bottom->height() > 130 && top->height() == c_Bordersize, 5000);
+    QTRY_COMPARE(scene.seenHandles(), 3);
+    scene.window->resize(900, 600);
+    scene.clickGrab(top);
+    QTRY_VERIFY_WITH_TIMEOUT(top->height() > 130, 5000);
+    QTest::qWait(350);
+    QVERIFY(bottom->isFadedIn());
+    scene.window->resize(900, 300); // the time line stays
+    QTRY_COMPARE_WITH_TIMEOUT(top->height(), c_Bordersize, 5000);
+    QVERIFY(bottom->height() > 130);
 }
 
 void TestRecordStripes::aRemovedCameraTakesItsEventsAlong()
