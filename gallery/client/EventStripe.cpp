@@ -10,6 +10,8 @@
 #include <QtGui/QPainter>
 #include <QtGui/QPainterPath>
 #include <QtGui/QWheelEvent>
+#include <QtWidgets/QStyle>
+#include <QtWidgets/QStyleOption>
 #include <QtWidgets/QToolTip>
 
 #include "../cameras/Scene.h"
@@ -34,7 +36,6 @@ EventStripe::EventStripe(Fleet& fleet, QWidget* parent)
     : QWidget(parent)
     , m_fleet(fleet)
 {
-    setAttribute(Qt::WA_StyledBackground);
     setMouseTracking(true);
     m_timer.setInterval(s_refresh);
     connect(&m_timer, &QTimer::timeout, this, &EventStripe::readEvents);
@@ -176,6 +177,10 @@ void EventStripe::paintCell(QPainter& painter, int index, const QRect& cell, boo
 void EventStripe::paintEvent(QPaintEvent* event)
 {
     QPainter painter(this);
+    painter.fillRect(rect(), palette().window());
+    QStyleOption option;
+    option.initFrom(this);
+    style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
     painter.setRenderHint(QPainter::Antialiasing);
     if (m_events.isEmpty()) {
         painter.setPen(palette().color(QPalette::WindowText));
@@ -280,6 +285,11 @@ bool EventStripe::event(QEvent* event)
             this, rectOf(index));
         return true;
     }
-    return QWidget::event(event);
+    const bool result = QWidget::event(event);
+    if (event->type() == QEvent::Polish || event->type() == QEvent::StyleChange) {
+        // Opaque, so that the pictures below can run without having this painted as often. Style sheets take it away.
+        setAttribute(Qt::WA_OpaquePaintEvent);
+    }
+    return result;
 }
 }

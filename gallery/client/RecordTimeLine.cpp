@@ -5,7 +5,10 @@
 #include <QtCore/QDateTime>
 #include <QtCore/QEvent>
 #include <QtCore/QVariant>
+#include <QtGui/QPainter>
 #include <QtWidgets/QHBoxLayout>
+#include <QtWidgets/QStyle>
+#include <QtWidgets/QStyleOption>
 
 #include "Fleet.h"
 #include "TimeTrack.h"
@@ -43,7 +46,6 @@ RecordTimeLine::RecordTimeLine(Fleet& fleet, QWidget* parent)
     , m_liveButton(new QPushButton(m_words))
     , m_track(new TimeTrack(this, this))
 {
-    setAttribute(Qt::WA_StyledBackground);
     m_moment->setObjectName(QStringLiteral("momentLabel"));
     m_moment->setProperty("role", QStringLiteral("heading"));
     m_range->setObjectName(QStringLiteral("rangeLabel"));
@@ -213,6 +215,25 @@ void RecordTimeLine::askForMoment()
         choose(m_track->moment());
     });
     m_popover->setActive(true, rows::Controller::epsBalloon | rows::Controller::epsNoFade, false);
+}
+
+// Opaque, so that the pictures below can run without having this painted as often.
+void RecordTimeLine::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    painter.fillRect(rect(), palette().window());
+    QStyleOption option;
+    option.initFrom(this);
+    style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
+}
+
+bool RecordTimeLine::event(QEvent* event)
+{
+    const bool result = QWidget::event(event);
+    if (event->type() == QEvent::Polish || event->type() == QEvent::StyleChange) {
+        setAttribute(Qt::WA_OpaquePaintEvent); // style sheets take it away
+    }
+    return result;
 }
 
 void RecordTimeLine::resizeEvent(QResizeEvent*)

@@ -185,6 +185,13 @@ class TestRecordStripes : public zelkovtest::TestCase
 
 private Q_SLOTS:
     void initTestCase() { vx::PopoverWidget::Manager::init(1000); }
+    void cleanup()
+    {
+        if (!qApp->styleSheet().isEmpty()) {
+            zelkov::theme::apply(*qApp, zelkov::theme::Name::None);
+        }
+        TestCase::cleanup();
+    }
     void cleanupTestCase() { vx::PopoverWidget::Manager::deleteInstance(); }
 
     // The time line
@@ -1167,9 +1174,6 @@ void TestRecordStripes::picturesBelowDoNotRepaintThePanels()
         QVERIFY(walls.count >= 15);
         QVERIFY2(panels.count <= 4, qPrintable(QString::number(panels.count)));
     }
-    if (themed) {
-        zelkov::theme::apply(*qApp, zelkov::theme::Name::None);
-    }
 }
 
 void TestRecordStripes::aNewThemeComesAtOnce()
@@ -1202,7 +1206,6 @@ void TestRecordStripes::aNewThemeComesAtOnce()
         QVERIFY(grounds.at(0).lightness() > 200);
         QVERIFY(grounds.at(1).lightness() < 80);
     }
-    zelkov::theme::apply(*qApp, zelkov::theme::Name::None);
 }
 
 void TestRecordStripes::aNewLanguageComesAtOnce()
