@@ -1151,7 +1151,7 @@
     </message>
     <message>
         <source>A whole client made of the library. Log in as user with camera1!, or as admin with camera2!, who may export, steer and edit.</source>
-        <translation>Un client entier fait avec la bibliothèque. Connectez-vous comme user avec camera1! ou comme admin avec camera2!, qui peut exporter, piloter et modifier.</translation>
+        <translation>Un client entier fait avec la bibliothèque. Entrez comme user avec camera1! ou comme admin avec camera2!, qui peut tout.</translation>
     </message>
 </context>
 <context>

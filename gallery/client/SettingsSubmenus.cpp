@@ -249,7 +249,9 @@ void SettingsPopover::addAccount(Container* container)
         const int number = after->valueItem()->value();
         const int time = after->unitItem()->currentIndex() == 1 ? number * 60 : number;
         m_settings.set(&Settings::Values::idleSeconds, idle->value().toBool() ? time : 0);
+        after->setChecked(idle->value().toBool()); // any change checks it
     };
+    after->setChecked(seconds > 0);
     connect(idle, &Item::itemPerformed, after, take);
     connect(after->valueItem(), QOverload<int>::of(&QSpinBox::valueChanged), this, take);
     connect(after->unitItem(), QOverload<int>::of(&QComboBox::currentIndexChanged), this, take);

@@ -9,6 +9,7 @@
 #include "client/Reconnection.h"
 #include "client/Session.h"
 #include "controls/PasswordCheckWidget.h"
+#include "indicators/ElidedButton.h"
 #include "indicators/ElidedLabel.h"
 #include "input/CustomClickAdapter.h"
 #include "popover/Container.h"
@@ -745,7 +746,9 @@ void TestClientDesk::anIdleUserIsLoggedOut()
     QVERIFY(!c.find<Item>("idleSwitchRow")->value().toBool());
     unit->setCurrentIndex(0);
     number->setValue(2);
+    QVERIFY(!c.find<Item>("idleRow")->textElement()->isChecked());
     c.clickRow("idleSwitchRow");
+    QTRY_VERIFY(c.find<Item>("idleRow")->textElement()->isChecked());
     QTRY_COMPARE_WITH_TIMEOUT(c.session().role(), Session::Role::None, 6000);
     QTRY_COMPARE(c.pages()->currentWidget(), c.widget("loginPanel"));
     QVERIFY(c.openPopovers().isEmpty());
