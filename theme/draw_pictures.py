@@ -130,7 +130,7 @@ def around(cx, cy, radius, degrees):
     return cx + radius * math.cos(math.radians(degrees)), cy + radius * math.sin(math.radians(degrees))
 
 
-def dial_plate(strong, n=216):
+def dial_plate(n, strong):
     """From the lower left over the top to the lower right, as the dial turns."""
     c = n / 2
     return render(n, n, [
@@ -138,32 +138,36 @@ def dial_plate(strong, n=216):
               (0.011 if i % 10 else 0.016) * n), plain(*strong)) for i in range(21)])
 
 
-def dial_knob(strong, face, accent, n=160):
+def dial_knob(n, strong, face, accent):
     c, r = n / 2, 0.46 * n
     layers = [(circle(c, c + 0.012 * n, r + 0.012 * n), plain(0, 0, 0, 50)), (circle(c, c, r), fall(*face, n)),
               (ring(c, c, r, 0.014 * n), plain(*strong))]
     return render(n, n, layers + ([(line(c, c - 0.84 * r, c, c - 0.45 * r, 0.06 * n), plain(*accent))] if accent else []))
 
 
-def stick_cross(strong, n=328):
+def stick_cross(n, strong):
     c, r = n / 2, 0.4 * n
     width = n / 130
     return render(n, n, [(shape, plain(*strong)) for shape in (
         ring(c, c, r, width), ring(c, c, r / 2, width), line(c - r, c, c + r, c, width), line(c, c - r, c, c + r, width))])
 
 
-def dot(colour, rim, n, inset=0.08):
+def dot(n, colour, rim, inset=0.08):
     c = n / 2
     return render(n, n, [(circle(c, c, (0.5 - inset) * n), plain(*rim)), (circle(c, c, (0.5 - inset - 0.09) * n), plain(*colour))])
 
 
 def controls():
     for theme, (strong, face, accent, bad, rim) in LOOKS.items():
-        for name, rows in (("dial-plate", dial_plate(strong)), ("dial-knob", dial_knob(strong, face, accent)),
-                           ("dial-disc", dial_knob(strong, face, None)), ("dial-dot", dot(accent, rim, 14, 0.02)),
-                           ("stick-cross", stick_cross(strong)), ("stick-point", dot(accent, rim, 66)),
-                           ("playhead", dot(accent, rim, 72)), ("playhead-off", dot(bad, rim, 72))):
-            write(os.path.join(HERE, "pictures", theme, name + ".png"), RGBA, rows)
+        for suffix, scale in (("", 1), ("@2x", 2)):
+            for name, rows in (("dial-plate", dial_plate(108 * scale, strong)),
+                               ("dial-knob", dial_knob(80 * scale, strong, face, accent)),
+                               ("dial-disc", dial_knob(80 * scale, strong, face, None)),
+                               ("dial-dot", dot(14 * scale, accent, rim, 0.02)),
+                               ("stick-cross", stick_cross(164 * scale, strong)),
+                               ("stick-point", dot(33 * scale, accent, rim)),
+                               ("playhead", dot(36 * scale, accent, rim)), ("playhead-off", dot(36 * scale, bad, rim))):
+                write(os.path.join(HERE, "pictures", theme, name + suffix + ".png"), RGBA, rows)
 
 
 def main():
