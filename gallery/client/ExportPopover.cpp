@@ -70,6 +70,7 @@ enum Row : int
 const EItemFlags s_usual = eifText | eifControl;
 const int s_width = 340;
 const int s_rowHeight = 31;
+const int s_buttonHeight = 50;
 const int s_fieldWidth = 190;
 const int s_handle = 1;
 
@@ -186,6 +187,7 @@ Container* ExportPopover::makeButtons()
         EContainerFlags());
     bar->addItem(new PushItem(someText(), QString(), rowName("exportAccept"), rExport, flags, nullptr),
         EContainerFlags());
+    bar->setFixedHeight(s_buttonHeight); // or they would take the room that the rows need
     return bar;
 }
 
