@@ -2,6 +2,8 @@
 // Base of widgets that fade in and out as a whole.
 #include "foundation/FadableThing.h"
 
+#include "foundation/WidgetPrimitive.h"
+
 #include <QAbstractButton>
 #include <QEasingCurve>
 #include <QPainter>
@@ -40,9 +42,12 @@ void FadableThing<T>::paintEvent(QPaintEvent* event)
 template <typename T>
 void FadableThing<T>::draw(QPaintEvent* /*event*/, QPainter& painter)
 {
+    painter.setOpacity(m_fader->getOpacity());
+    if (!vx::WidgetPrimitive::isPaintedBy(*this->style())) {
+        return;
+    }
     QStyleOption option;
     option.initFrom(this);
-    painter.setOpacity(m_fader->getOpacity());
     // The pointers are compared, so that subclasses of the push button do not qualify.
     const void* const ownName = this->metaObject()->className();
     if (ownName == static_cast<const void*>(QPushButton::staticMetaObject.className())) {

@@ -2,35 +2,14 @@
 // The badge as a widget: properties and painting, everything else is the drawer's.
 #include "indicators/BadgeWidget.h"
 
+#include "foundation/WidgetPrimitive.h"
+
 #include <QPainter>
 #include <QStyle>
 #include <QStyleOption>
 
-#include <cstring>
-
 namespace vx
 {
-
-namespace
-{
-
-// Only style sheets and styles of applications paint anything for PE_Widget. Fusion, the usual style, does not,
-// but takes about as long to find out as a whole frame of a spinner takes to draw.
-bool paintsWidgets(const QStyle& style)
-{
-    static const QMetaObject* fusion = nullptr;
-    const QMetaObject* const meta = style.metaObject();
-    if (meta == fusion) {
-        return false;
-    }
-    if (std::strcmp(meta->className(), "QFusionStyle") != 0) {
-        return true;
-    }
-    fusion = meta;
-    return false;
-}
-
-} // namespace
 
 BadgeWidget::BadgeWidget(QWidget* parent)
     : QWidget(parent)
@@ -159,7 +138,7 @@ void BadgeWidget::paintEvent(QPaintEvent*)
 {
     QPainter painter(this);
     QStyle* const currentStyle = style();
-    if (paintsWidgets(*currentStyle)) {
+    if (WidgetPrimitive::isPaintedBy(*currentStyle)) {
         QStyleOption option;
         option.initFrom(this);
         currentStyle->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);

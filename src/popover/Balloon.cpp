@@ -4,7 +4,6 @@
 
 #include "CoreQt/Connect.h"
 #include "popover/BalloonGeometry.h"
-#include "popover/BalloonLook.h"
 #include "popover/BalloonTarget.h"
 #include "popover/Container.h"
 #include "sliders/NicerScrollBar.h"
@@ -21,6 +20,8 @@
 #include <QtWidgets/QScrollBar>
 #include <QtWidgets/QVBoxLayout>
 
+#include <cmath>
+
 namespace vx
 {
 namespace PopoverWidget
@@ -28,6 +29,7 @@ namespace PopoverWidget
 namespace
 {
 constexpr int c_ButtonSpacing = 4;
+constexpr int c_LargestKeptBody = 1000 * 1000; // pixels
 
 static_assert(int(Balloon::eadTop) == BalloonGeometry::sTop && int(Balloon::eadBottom) == BalloonGeometry::sBottom
         && int(Balloon::eadLeft) == BalloonGeometry::sLeft && int(Balloon::eadRight) == BalloonGeometry::sRight,
@@ -38,6 +40,25 @@ void setUpBalloonLayout(QBoxLayout* layout)
     layout->setAlignment(Qt::AlignCenter);
     layout->setSpacing(0);
     layout->setContentsMargins(0, 0, 0, 0);
+}
+
+void paintBody(QPainter& painter, const BalloonLook& look, const QPainterPath& path)
+{
+    painter.setPen(Qt::NoPen);
+    if (look.lower == look.upper) {
+        painter.setBrush(look.upper); // the same pixels, in less time
+    } else {
+        QLinearGradient gradient;
+        gradient.setCoordinateMode(QGradient::ObjectBoundingMode);
+        gradient.setColorAt(1.0, look.lower);
+        gradient.setColorAt(0.5, look.upper);
+        painter.setBrush(gradient);
+    }
+    painter.setRenderHint(QPainter::Antialiasing);
+    if (look.border.isValid()) {
+        painter.setPen(QPen(look.border, 1.0, Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin));
+    }
+    painter.drawPath(path);
 }
 
 QPushButton* makeTitleButton(const QString& objectName, QWidget* parent)
@@ -460,9 +481,26 @@ void Balloon::setupLayout(bool ignoreVisibility)
 void Balloon::setVisible(bool visible)
 {
     const QPointer<Balloon> alive(this);
+    // The size so far is that without the title bar, which was not visible when it was worked out. A balloon that is
+    // shown again does not lay out its rows for it, only to lay them out again in a moment.
+    const bool again = visible && m_wasShown && isHidden() && m_mainLayout->isEnabled();
+    if (again) {
+        m_mainLayout->setEnabled(false);
+    }
     QWidget::setVisible(visible);
-    if (alive && visible && !size().isEmpty()) {
+    if (!alive) {
+        return;
+    }
+    if (again) {
+        m_mainLayout->setEnabled(true);
+        m_mainLayout->invalidate();
+    }
+    if (visible && !size().isEmpty()) {
+        m_wasShown = true;
         setupLayout(true);
+    }
+    if (alive && again) {
+        m_mainLayout->activate();
     }
 }
 
@@ -481,19 +519,26 @@ void Balloon::paintEvent(QPaintEvent* /*event*/)
 {
     const BalloonLook look
         = BalloonLook::resolved(m_backgroundColor, m_backgroundColor2, m_borderColor, palette());
+    const QPainterPath path
+        = getPainterPathForDownArrow(m_arrowWidth, m_arrowLength, int(m_arrowDirection), m_anchorPoint - pos());
     QPainter painter(this);
-    painter.setPen(Qt::NoPen);
-    QLinearGradient gradient;
-    gradient.setCoordinateMode(QGradient::ObjectBoundingMode);
-    gradient.setColorAt(1.0, look.lower);
-    gradient.setColorAt(0.5, look.upper);
-    painter.setBrush(gradient);
-    painter.setRenderHint(QPainter::Antialiasing);
-    if (look.border.isValid()) {
-        painter.setPen(QPen(look.border, 1.0, Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin));
+    // A body wanted for the second time is kept: to draw it takes longer than all rows of a small popover. Not where
+    // it would have to be scaled.
+    const bool sameAgain = m_body.look == look && m_body.path == path;
+    const QTransform& transform = painter.combinedTransform();
+    if (!sameAgain || transform.type() > QTransform::TxTranslate || transform.dx() != std::floor(transform.dx())
+        || transform.dy() != std::floor(transform.dy()) || qint64(width()) * height() > c_LargestKeptBody) {
+        m_body = {look, path, QPixmap()};
+        paintBody(painter, look, path);
+        return;
     }
-    painter.drawPath(
-        getPainterPathForDownArrow(m_arrowWidth, m_arrowLength, int(m_arrowDirection), m_anchorPoint - pos()));
+    if (m_body.picture.size() != size()) {
+        m_body.picture = QPixmap(size());
+        m_body.picture.fill(Qt::transparent);
+        QPainter bodyPainter(&m_body.picture);
+        paintBody(bodyPainter, look, path);
+    }
+    painter.drawPixmap(0, 0, m_body.picture);
 }
 
 void Balloon::mouseReleaseEvent(QMouseEvent* event)

@@ -3,16 +3,18 @@
 #pragma once
 
 #include "foundation/Export.h"
+#include "popover/BalloonLook.h"
 
 #include <QtCore/QPointer>
 #include <QtCore/QPointF>
 #include <QtCore/QRect>
 #include <QtCore/QSizeF>
 #include <QtGui/QColor>
+#include <QtGui/QPainterPath>
+#include <QtGui/QPixmap>
 #include <QtWidgets/QWidget>
 
 class QLabel;
-class QPainterPath;
 class QPushButton;
 class QScrollArea;
 class QVBoxLayout;
@@ -228,6 +230,15 @@ private:
 
     QVBoxLayout* m_mainLayout = nullptr;
     mutable QSize m_contentHint; // of the container when it was last adjusted
+
+    struct Body
+    {
+        BalloonLook look;
+        QPainterPath path;
+        QPixmap picture; // null until it is painted again
+    };
+    Body m_body; // as last painted
+    bool m_wasShown = false;
 };
 
 Q_DECLARE_OPERATORS_FOR_FLAGS(Balloon::EArrowDirections)

@@ -24,5 +24,11 @@ struct ZELKOV_WIDGETS_EXPORT BalloonLook
     QColor upper; ///< from its middle on
     QColor border; ///< of the outline; invalid for none
 };
+
+/// Whether all three colours are the same.
+inline bool operator==(const BalloonLook& a, const BalloonLook& b)
+{
+    return a.lower == b.lower && a.upper == b.upper && a.border == b.border;
+}
 }
 }

@@ -3,12 +3,11 @@
 #include "popover/Container.h"
 
 #include "CoreQt/Connect.h"
+#include "foundation/WidgetPrimitive.h"
 #include "popover/WidgetItem.h"
 
-#include <QtGui/QPainter>
+#include <QtCore/QMetaMethod>
 #include <QtWidgets/QHBoxLayout>
-#include <QtWidgets/QStyle>
-#include <QtWidgets/QStyleOption>
 #include <QtWidgets/QVBoxLayout>
 
 namespace vx
@@ -19,13 +18,35 @@ namespace
 {
 constexpr char c_ItemPerformed[]
     = "2itemPerformed( int, const QVariant &,const QVariant&, vx::PopoverWidget::EItemPerformedFlags )";
-constexpr char c_LayoutChanged[] = "2layoutChanged()";
 
 /// An item that is added again is not connected twice.
-void connectOnce(const QObject* sender, const char* signal, const QObject* receiver, const char* member,
+void connectOnce(const QObject* sender, const char* signal, const QObject* receiver, const char* member)
+{
+    vx::connect(sender, signal, receiver, member, Qt::UniqueConnection);
+}
+
+/// The signals of rows and of their container, looked up once: by text that takes longer than making the row. The
+/// connections are the same as by text, so vx::disconnect() finds them.
+struct RowSignals
+{
+    const int performed = QMetaMethod::fromSignal(&Item::itemPerformed).methodIndex();
+    const int layoutChanged = QMetaMethod::fromSignal(&Item::layoutChanged).methodIndex();
+    const int ownPerformed = QMetaMethod::fromSignal(&Container::itemPerformed).methodIndex();
+    const int ownLayoutChanged = QMetaMethod::fromSignal(&Container::layoutChanged).methodIndex();
+    const int dismiss = QMetaMethod::fromSignal(&Container::dismissPopover).methodIndex();
+    const int dismissAll = QMetaMethod::fromSignal(&Container::dismissAllPopover).methodIndex();
+};
+
+const RowSignals& rowSignals()
+{
+    static const RowSignals all;
+    return all;
+}
+
+void connectOnce(const Item* sender, int signal, const Container* receiver, int member,
     Qt::ConnectionType type = Qt::AutoConnection)
 {
-    vx::connect(sender, signal, receiver, member, static_cast<Qt::ConnectionType>(type | Qt::UniqueConnection));
+    QMetaObject::connect(sender, signal, receiver, member, type | Qt::UniqueConnection);
 }
 }
 
@@ -232,11 +253,14 @@ void Container::popoverOpened()
 
 void Container::applyFlags(Item* item, QFlags<EContainerFlag> flags)
 {
+    if (!item) {
+        return;
+    }
     if (flags.testFlag(ecfDismiss)) {
-        connectOnce(item, c_ItemPerformed, this, "2dismissPopover()");
+        connectOnce(item, rowSignals().performed, this, rowSignals().dismiss);
     }
     if (flags.testFlag(ecfDismissAll)) {
-        connectOnce(item, c_ItemPerformed, this, "2dismissAllPopover()");
+        connectOnce(item, rowSignals().performed, this, rowSignals().dismissAll);
     }
 }
 
@@ -246,9 +270,9 @@ void Container::applyDefaultConnects(Item* item)
         return;
     }
     if (!item->itemFlags().testFlag(eifNoForward)) {
-        connectOnce(item, c_ItemPerformed, this, c_ItemPerformed);
+        connectOnce(item, rowSignals().performed, this, rowSignals().ownPerformed);
     }
-    connectOnce(item, c_LayoutChanged, this, c_LayoutChanged, Qt::QueuedConnection);
+    connectOnce(item, rowSignals().layoutChanged, this, rowSignals().ownLayoutChanged, Qt::QueuedConnection);
 }
 
 int Container::leftMargin() const
@@ -378,10 +402,7 @@ void Container::emitLayoutChanged()
 
 void Container::paintEvent(QPaintEvent* /*event*/)
 {
-    QStyleOption option;
-    option.initFrom(this);
-    QPainter painter(this);
-    style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
+    WidgetPrimitive::paint(this);
 }
 
 } // namespace PopoverWidget

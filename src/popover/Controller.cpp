@@ -39,6 +39,7 @@ Controller::Controller(QWidget* inWidget, QWidget* forWidget, bool isSubControll
     , m_size(size)
     , m_sizeConstraints(constraints)
 {
+    all() << this;
     setObjectName(objectName);
     setInWidget(inWidget);
 }
@@ -57,6 +58,13 @@ Controller::~Controller()
     if (m_balloon != nullptr && m_balloon->parentWidget() != this) {
         delete m_balloon.data();
     }
+    all().removeOne(this);
+}
+
+QList<Controller*>& Controller::all()
+{
+    static auto* const controllers = new QList<Controller*>; // outlives windows that go at the very end
+    return *controllers;
 }
 
 void Controller::setContainer(Container* container, QFlags<Balloon::EBalloonFeature> features)

@@ -9,6 +9,7 @@
 
 #include <QDialogButtonBox>
 #include <QFlags>
+#include <QList>
 #include <QMargins>
 #include <QMetaType>
 #include <QPointer>
@@ -118,6 +119,8 @@ public:
     /// The covered window or controller; null if there is none.
     QWidget* inWidget() const;
 
+    /// Hiding an overlay of which nothing was seen repaints nothing.
+    void setVisible(bool visible) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 Q_SIGNALS:
@@ -215,6 +218,9 @@ private:
     void leaveInterruptedMotion();
     void setContentVisible(bool visible);
     void emitOwedLayoutUpdated();
+    bool isUnseen() const;
+    QList<QPointer<Controller>> nestedControllers() const;
+    static QList<Controller*>& all();
     void buildBalloon(QFlags<Balloon::EBalloonFeature> features);
     void buildEmbedded();
 

@@ -2,6 +2,7 @@
 // vx::PopoverWidget::Controller: clicks outside, keys, drops, and what happens to the widgets around it.
 #include "popover/Controller.h"
 
+#include "foundation/WidgetPrimitive.h"
 #include "popover/Container.h"
 #include "popover/ControllerVerdicts.h"
 
@@ -15,6 +16,9 @@
 #include <QMouseEvent>
 #include <QResizeEvent>
 #include <QShowEvent>
+
+#include <algorithm>
+#include <typeinfo>
 
 namespace vx
 {
@@ -91,16 +95,59 @@ void Controller::resizeEvent(QResizeEvent* event)
         return;
     }
     FadableThing<QWidget>::resizeEvent(event);
-    QList<QPointer<Controller>> nested;
-    const QList<Controller*> found = findChildren<Controller*>();
-    for (Controller* controller : found) {
-        nested << controller;
-    }
-    for (const QPointer<Controller>& controller : qAsConst(nested)) {
+    const QList<QPointer<Controller>> nested = nestedControllers();
+    for (const QPointer<Controller>& controller : nested) {
         if (controller != nullptr) {
             controller->event(event);
         }
     }
+}
+
+void Controller::setVisible(bool visible)
+{
+    if (visible || !isUnseen()) {
+        FadableThing<QWidget>::setVisible(visible);
+        return;
+    }
+    const QPointer<Controller> self(this);
+    setAttribute(Qt::WA_UpdatesDisabled, true);
+    FadableThing<QWidget>::setVisible(false);
+    if (self != nullptr) {
+        setAttribute(Qt::WA_UpdatesDisabled, false);
+    }
+}
+
+/// Whether the overlay is up without a picture of its own: the balloon has gone, and no style sheet paints it.
+bool Controller::isUnseen() const
+{
+    if (!isVisible() || isWindow() || !updatesEnabled() || typeid(*this) != typeid(Controller)
+        || WidgetPrimitive::isPaintedBy(*style()) || autoFillBackground() || graphicsEffect() != nullptr
+        || testAttribute(Qt::WA_StyledBackground) || testAttribute(Qt::WA_OpaquePaintEvent)) {
+        return false;
+    }
+    return std::none_of(children().cbegin(), children().cend(), [](const QObject* child) {
+        const auto* const widget = qobject_cast<const QWidget*>(child);
+        return widget != nullptr && !widget->isHidden();
+    });
+}
+
+QList<QPointer<Controller>> Controller::nestedControllers() const
+{
+    // Most popovers hold none, and a search through all their rows would find that out with every resize.
+    QList<QPointer<Controller>> nested;
+    if (std::any_of(all().cbegin(), all().cend(), [this](const Controller* other) {
+            const QObject* parent = other->parent();
+            while (parent != nullptr && parent != this) {
+                parent = parent->parent();
+            }
+            return parent != nullptr;
+        })) {
+        const QList<Controller*> found = findChildren<Controller*>();
+        for (Controller* controller : found) {
+            nested << controller;
+        }
+    }
+    return nested;
 }
 
 void Controller::showEvent(QShowEvent* event)

@@ -2,6 +2,7 @@
 // One row of a popover: elements, clicks, busy mark, protection.
 #include "popover/Item.h"
 
+#include "foundation/WidgetPrimitive.h"
 #include "indicators/BadgeWidget.h"
 #include "indicators/ElidedButton.h"
 #include "popover/ItemRules.h"
@@ -9,12 +10,9 @@
 
 #include <QtCore/QTimer>
 #include <QtGui/QMouseEvent>
-#include <QtGui/QPainter>
 #include <QtWidgets/QApplication>
 #include <QtWidgets/QGraphicsDropShadowEffect>
 #include <QtWidgets/QHBoxLayout>
-#include <QtWidgets/QStyle>
-#include <QtWidgets/QStyleOption>
 
 namespace vx
 {
@@ -42,6 +40,46 @@ QRect elementRect(const QWidget* element)
 {
     return element ? element->geometry() : QRect();
 }
+
+/// Whether nothing of the widget can be seen, since it lies outside of a widget around it.
+bool isClippedAway(const QWidget* widget)
+{
+    QRect rect = widget->rect();
+    while (!widget->isWindow() && widget->parentWidget()) {
+        rect.translate(widget->pos());
+        widget = widget->parentWidget();
+        rect &= widget->rect();
+        if (rect.isEmpty()) {
+            return true;
+        }
+    }
+    return false;
+}
+
+/// Asks for a repaint after a show, which Qt clips and compares with all siblings at a cost of its own for each row;
+/// in a long list most rows are out of sight. Scrolling into sight repaints them anyway.
+bool isUselessUpdate(const QEvent* event, const QWidget* widget)
+{
+    return event->type() == QEvent::UpdateLater && !widget->graphicsEffect() && isClippedAway(widget);
+}
+
+/// The buttons of a row. No meta object of its own, for style sheets know it as ElidedButton.
+class ItemElement : public ElidedButton
+{
+public:
+    using ElidedButton::ElidedButton;
+
+protected:
+    bool event(QEvent* event) override
+    {
+        // A push button asks its layout for another pass when this comes, with the first turn of the event loop. It
+        // has been dressed long before, and its row has been laid out with the size it has since.
+        if (event->type() == QEvent::PolishRequest && testAttribute(Qt::WA_WState_Polished)) {
+            return QAbstractButton::event(event);
+        }
+        return isUselessUpdate(event, this) || ElidedButton::event(event);
+    }
+};
 }
 
 const QString Item::sPopoverWidgetItem = QStringLiteral("PopoverWidgetItem");
@@ -113,7 +151,7 @@ Item::~Item() = default;
 
 ElidedButton* Item::createElement(const QString& objectName, const QString& text, bool fillsBackground)
 {
-    auto* const element = new ElidedButton(text, this);
+    auto* const element = new ItemElement(text, this);
     element->setFlat(true);
     element->setAutoFillBackground(fillsBackground);
     element->setObjectName(objectName);
@@ -221,7 +259,9 @@ void Item::setBusy(bool busy, bool hideLast)
     } else {
         m_busyWidget->setBadgeBusy(false);
         m_busyWidget->hide();
-        if (m_lastElement) {
+        // In a row that is being made it is not hidden; to show it would dress it, too early for the style sheets of
+        // the popover.
+        if (m_lastElement && m_lastElement->isHidden()) {
             m_lastElement->show();
         }
     }
@@ -474,6 +514,11 @@ void Item::performDoubleClick(QFlags<EItemPerformedFlag> flags)
     performSingleClick(flags | eipDoubleClick);
 }
 
+bool Item::event(QEvent* event)
+{
+    return isUselessUpdate(event, this) || QWidget::event(event);
+}
+
 bool Item::eventFilter(QObject* watched, QEvent* event)
 {
     if ((event->type() == QEvent::MouseButtonPress || event->type() == QEvent::MouseButtonRelease)
@@ -515,10 +560,7 @@ void Item::mouseDoubleClickEvent(QMouseEvent* event)
 
 void Item::paintEvent(QPaintEvent* /*event*/)
 {
-    QStyleOption option;
-    option.initFrom(this);
-    QPainter painter(this);
-    style()->drawPrimitive(QStyle::PE_Widget, &option, &painter, this);
+    WidgetPrimitive::paint(this);
 }
 
 void Item::showEvent(QShowEvent* event)

@@ -188,6 +188,7 @@ protected:
     /// performSingleClick() with eipDoubleClick added.
     void performDoubleClick(QFlags<EItemPerformedFlag> flags);
 
+    bool event(QEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseDoubleClickEvent(QMouseEvent* event) override;
