@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Popovers beside what Qt offers for the same: a list of buttons in a scroll area, a menu shown again. Each figure
-// that counts is a ratio of the two, taken in turns in one run. Where a floor is given, it is what Qt takes for as many
-// widgets and layouts as a popover has, without a line of the library: "ratio" cannot come below "floor_ratio".
+// that counts is a ratio of the two, taken in turns in one run. Where a floor is given, it is what Qt takes for as
+// many widgets and layouts as a popover has, without a line of the library: "ratio" cannot come below
+// "floor_ratio".
 #include "popover/Balloon.h"
 #include "popover/BalloonGeometry.h"
 #include "popover/Container.h"

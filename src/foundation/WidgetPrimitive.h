@@ -11,6 +11,7 @@
 
 namespace vx
 {
+/// What all widgets with a look from a style sheet do in their paint event.
 namespace WidgetPrimitive
 {
 /// Whether the style may paint anything for QStyle::PE_Widget. Style sheets and styles of applications do. Fusion,

@@ -481,8 +481,8 @@ void Balloon::setupLayout(bool ignoreVisibility)
 void Balloon::setVisible(bool visible)
 {
     const QPointer<Balloon> alive(this);
-    // The size so far is that without the title bar, which was not visible when it was worked out. A balloon that is
-    // shown again does not lay out its rows for it, only to lay them out again in a moment.
+    // The size so far is that without the title bar, which was not visible when it was worked out. A balloon that
+    // is shown again does not lay out its rows for it, only to lay them out again in a moment.
     const bool again = visible && m_wasShown && isHidden() && m_mainLayout->isEnabled();
     if (again) {
         m_mainLayout->setEnabled(false);
@@ -522,8 +522,8 @@ void Balloon::paintEvent(QPaintEvent* /*event*/)
     const QPainterPath path
         = getPainterPathForDownArrow(m_arrowWidth, m_arrowLength, int(m_arrowDirection), m_anchorPoint - pos());
     QPainter painter(this);
-    // A body wanted for the second time is kept: to draw it takes longer than all rows of a small popover. Not where
-    // it would have to be scaled.
+    // A body wanted for the second time is kept: to draw it takes longer than all rows of a small popover. Not
+    // where it would have to be scaled.
     const bool sameAgain = m_body.look == look && m_body.path == path;
     const QTransform& transform = painter.combinedTransform();
     if (!sameAgain || transform.type() > QTransform::TxTranslate || transform.dx() != std::floor(transform.dx())

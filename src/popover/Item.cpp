@@ -56,8 +56,8 @@ bool isClippedAway(const QWidget* widget)
     return false;
 }
 
-/// Asks for a repaint after a show, which Qt clips and compares with all siblings at a cost of its own for each row;
-/// in a long list most rows are out of sight. Scrolling into sight repaints them anyway.
+/// Asks for a repaint after a show, which Qt clips and compares with all siblings at a cost of its own for each
+/// row; in a long list most rows are out of sight. Scrolling into sight repaints them anyway.
 bool isUselessUpdate(const QEvent* event, const QWidget* widget)
 {
     return event->type() == QEvent::UpdateLater && !widget->graphicsEffect() && isClippedAway(widget);
@@ -72,8 +72,8 @@ public:
 protected:
     bool event(QEvent* event) override
     {
-        // A push button asks its layout for another pass when this comes, with the first turn of the event loop. It
-        // has been dressed long before, and its row has been laid out with the size it has since.
+        // A push button asks its layout for another pass when this comes, with the first turn of the event loop.
+        // It has been dressed long before, and its row has been laid out with the size it has since.
         if (event->type() == QEvent::PolishRequest && testAttribute(Qt::WA_WState_Polished)) {
             return QAbstractButton::event(event);
         }
@@ -259,8 +259,8 @@ void Item::setBusy(bool busy, bool hideLast)
     } else {
         m_busyWidget->setBadgeBusy(false);
         m_busyWidget->hide();
-        // In a row that is being made it is not hidden; to show it would dress it, too early for the style sheets of
-        // the popover.
+        // In a row that is being made it is not hidden; to show it would dress it, too early for the style sheets
+        // of the popover.
         if (m_lastElement && m_lastElement->isHidden()) {
             m_lastElement->show();
         }

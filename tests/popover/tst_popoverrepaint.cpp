@@ -6,9 +6,9 @@
 #include "popover/Manager.h"
 
 #include "BalloonScene.h"
-#include "TestRow.h"
 #include "support/TestCase.h"
 #include "support/TestMain.h"
+#include "TestRow.h"
 
 #include "CoreQt/Connect.h"
 #include "indicators/ElidedButton.h"
@@ -47,8 +47,9 @@ struct RepaintScene
         auto* const target = new QPushButton(QStringLiteral("target"), window);
         target->setGeometry(180, 20, 60, 20);
         window->show();
-        controller = Manager::instance()->createController(0, false, false, window, target, QStringLiteral("title"),
-            QString(), Balloon::eadTop | Balloon::eadBottom, QSizeF(), Balloon::ESizeConstraints());
+        controller
+            = Manager::instance()->createController(0, false, false, window, target, QStringLiteral("title"),
+                QString(), Balloon::eadTop | Balloon::eadBottom, QSizeF(), Balloon::ESizeConstraints());
         container = new Container(nullptr, QStringLiteral("rows"), Qt::Vertical, Qt::AlignTop);
         for (int i = 0; i < rows; ++i) {
             container->addItem(new TestRow(i));
@@ -75,10 +76,7 @@ struct RepaintScene
     // What is on the screen, as opposed to what a fresh paint would give.
     QImage screen() const
     {
-        return window->screen()
-            ->grabWindow(window->winId())
-            .toImage()
-            .convertToFormat(QImage::Format_RGB32);
+        return window->screen()->grabWindow(window->winId()).toImage().convertToFormat(QImage::Format_RGB32);
     }
     QImage fresh() const { return window->grab().toImage().convertToFormat(QImage::Format_RGB32); }
 
@@ -97,7 +95,8 @@ int worstDifference(const QImage& a, const QImage& b)
         for (int x = 0; x < a.width(); ++x) {
             const QRgb p = a.pixel(x, y);
             const QRgb q = b.pixel(x, y);
-            worst = qMax(worst, qMax(qAbs(qRed(p) - qRed(q)), qMax(qAbs(qGreen(p) - qGreen(q)), qAbs(qBlue(p) - qBlue(q)))));
+            const int green = qAbs(qGreen(p) - qGreen(q));
+            worst = qMax(worst, qMax(qAbs(qRed(p) - qRed(q)), qMax(green, qAbs(qBlue(p) - qBlue(q)))));
         }
     }
     return worst;
@@ -258,7 +257,8 @@ private Q_SLOTS:
         const QImage first = bodyOf(balloon);
         const QImage second = bodyOf(balloon);
         const QImage third = bodyOf(balloon);
-        QVERIFY2(worstDifference(first, second) <= 2, QByteArray::number(worstDifference(first, second)).constData());
+        QVERIFY2(
+            worstDifference(first, second) <= 2, QByteArray::number(worstDifference(first, second)).constData());
         QCOMPARE(worstDifference(second, third), 0);
     }
 
