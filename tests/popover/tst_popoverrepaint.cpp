@@ -205,6 +205,8 @@ private Q_SLOTS:
     void reopeningDoesNotLayOutTheRowsAgain()
     {
         RepaintScene scene(5);
+        // Wider than the rows, so that the size without the title bar differs.
+        scene.controller->setTitle(QString(40, QLatin1Char('m')));
         scene.open();
         auto* const row = static_cast<TestRow*>(scene.container->getItem(3));
         const QRect balloon = scene.controller->balloon()->geometry();
