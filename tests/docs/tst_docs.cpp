@@ -102,6 +102,9 @@ QStringList publicHeaders()
         QDirIterator files(root, {QStringLiteral("*.h")}, QDir::Files, QDirIterator::Subdirectories);
         while (files.hasNext()) {
             const QString path = files.next();
+            if (docs::readFile(path).left(300).contains(QLatin1String("; not installed."))) {
+                continue; // the library's own
+            }
             result << path.left(path.size() - 2);
         }
     }
