@@ -355,7 +355,7 @@ void ExportPopover::retranslate()
 
 bool ExportPopover::eventFilter(QObject* watched, QEvent* event)
 {
-    if (watched == m_rows && event->type() == QEvent::LanguageChange) {
+    if (event->type() == QEvent::LanguageChange && watched == m_rows) {
         retranslate();
     }
     return QObject::eventFilter(watched, event);

@@ -199,6 +199,9 @@ bool PtzPanel::eventFilter(QObject* watched, QEvent* event)
         return QWidget::eventFilter(watched, event);
     }
     const QEvent::Type type = event->type();
+    if (type != QEvent::MouseButtonPress && type != QEvent::MouseMove && type != QEvent::MouseButtonRelease) {
+        return QWidget::eventFilter(watched, event);
+    }
     const auto* const mouse = static_cast<QMouseEvent*>(event);
     if (type == QEvent::MouseButtonPress && mouse->button() == Qt::LeftButton) {
         m_isHeld = true;

@@ -433,7 +433,7 @@ private Q_SLOTS:
         QTRY_COMPARE(desk.order(), desk.fleetOrder());
         QCOMPARE(desk.order().size(), Fleet::s_count - 1);
         QTRY_COMPARE(desk.count(), QStringLiteral("63 devices"));
-        QCOMPARE(desk.list()->height(), desk.list()->sizeHint().height());
+        QTRY_COMPARE(desk.list()->height(), desk.list()->sizeHint().height());
     }
 
     void aDeviceDeletedElsewhereGoesWhileItsNameIsTyped()
