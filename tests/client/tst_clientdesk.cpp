@@ -29,6 +29,7 @@
 #include <QtCore/QTranslator>
 #include <QtCore/QXmlStreamReader>
 #include <QtGui/QDropEvent>
+#include <QtCore/QPropertyAnimation>
 #include <QtTest/QtTest>
 #include <QtWidgets/QAbstractButton>
 #include <QtWidgets/QApplication>
@@ -42,6 +43,7 @@
 #include <QtWidgets/QToolButton>
 #include <QtWidgets/QVBoxLayout>
 
+#include <algorithm>
 #include <memory>
 
 namespace
@@ -313,6 +315,13 @@ void TestClientDesk::aWrongNameStaysToo()
     c.type("passwordEdit", QStringLiteral("camera2!"));
     c.clickNamed("logInButton");
     QVERIFY(!c.message().isEmpty());
+    const auto shakes = [&c] {
+        const QList<QPropertyAnimation*> all = c.window.findChildren<QPropertyAnimation*>();
+        return std::any_of(all.begin(), all.end(), [](const QPropertyAnimation* each) {
+            return each->propertyName() == "pos" && each->state() == QAbstractAnimation::Running;
+        });
+    };
+    QTRY_VERIFY(!shakes()); // or the button is not where the click goes
     c.type("userEdit", QStringLiteral("user"));
     c.clickNamed("logInButton");
     QVERIFY(!c.message().isEmpty()); // the password of another one
