@@ -123,6 +123,8 @@ QWidget* TimeLabelsPage::makeNames()
         auto* line = new vx::NameTimeLabel;
         line->setFixedSize(width, 30);
         line->setFrameShape(QFrame::StyledPanel);
+        // The theme takes the frame away, and here the room is what is shown.
+        line->setStyleSheet(QStringLiteral("vx--NameTimeLabel { border: 1px solid palette(mid); border-radius: 4px; }"));
         line->setDeviceName(tr("Loading bay west"));
         line->setDate(m_start.toString(QStringLiteral("dd.MM.yyyy")));
         line->setTime(m_start.toString(QStringLiteral("HH:mm")));
